@@ -1,0 +1,89 @@
+#include "zemcore.h"
+
+#include <QApplication>
+#include <QByteArray>
+#include <QDir>
+#include <QLibraryInfo>
+#include <QLocale>
+#include <QTranslator>
+
+namespace {
+
+QString environmentPath(const char* name)
+{
+    return QString::fromLocal8Bit(qgetenv(name));
+}
+
+QString withoutTrailingSlash(QString path)
+{
+    while (path.size() > 1 && path.endsWith(QLatin1Char('/')))
+        path.chop(1);
+    return path;
+}
+
+QString userConfigDir()
+{
+    QString dir = environmentPath("ZEM_USER_DIR");
+    if (!dir.isEmpty())
+        return dir;
+    QString base = environmentPath("XDG_CONFIG_HOME");
+    if (base.isEmpty())
+        base = QDir::homePath() + QLatin1String("/.config");
+    return base + QLatin1String("/zem");
+}
+
+void installTranslator(QTranslator* translator, const QString& name, const QString& directory)
+{
+    if (translator->load(QLocale(), name, QStringLiteral("_"), directory))
+        QCoreApplication::installTranslator(translator);
+    else
+        delete translator;
+}
+
+} // namespace
+
+void zemInit(const char* version, const char* displayName)
+{
+    QCoreApplication::setOrganizationName(QStringLiteral("zem"));
+    QCoreApplication::setApplicationName(QStringLiteral("zem-admin-hotkeys"));
+    QCoreApplication::setApplicationVersion(QString::fromUtf8(version));
+    // The display name is kept out of Qt's hands: Qt would append it to every window title,
+    // and the editor's titles already say what they are.
+    Q_UNUSED(displayName)
+    QGuiApplication::setDesktopFileName(QStringLiteral("zem-admin-hotkeys"));
+
+    QCoreApplication* app = QCoreApplication::instance();
+    if (!app)
+        return;
+    // Qt's own catalogue translates the standard buttons of the message boxes.
+    installTranslator(new QTranslator(app), QStringLiteral("qtbase"),
+                      QLibraryInfo::location(QLibraryInfo::TranslationsPath));
+    installTranslator(new QTranslator(app), QStringLiteral("zem-admin-hotkeys"),
+                      QStringLiteral(ZEM_BUILD_TRANSLATIONS_DIR));
+}
+
+const std::string& GetZemDir(ZemDir which)
+{
+    // Answered anew on every call, so that a changed environment is seen; the caller may keep
+    // the reference until the next call for the same directory.
+    static std::string systemDir;
+    static std::string userDir;
+
+    if (which == ZEM_USER_CONFIG_DIR) {
+        const QString dir = withoutTrailingSlash(userConfigDir());
+        QDir().mkpath(dir);
+        userDir = dir.toUtf8().toStdString();
+        return userDir;
+    }
+
+    QString dir = environmentPath("ZEM_SYSTEM_DIR");
+    if (dir.isEmpty())
+        dir = QStringLiteral(ZEM_BUILD_SYSTEM_DIR);
+    systemDir = withoutTrailingSlash(dir).toUtf8().toStdString();
+    return systemDir;
+}
+
+std::string zemSessionConfigSuffix(WhatZemSession)
+{
+    return qgetenv("ZEM_SESSION_SUFFIX").toStdString();
+}

@@ -1,0 +1,116 @@
+#include "hotkeysfile.h"
+#include "keysconfform.h"
+#include "myapplication.h"
+#include "zemcore.h"
+
+#include <QFile>
+#include <QIcon>
+#include <QMessageBox>
+
+#include <cstdio>
+
+namespace {
+
+enum ExitStatus {
+    AnotherInstanceShown = 0,
+    UsageShown = 1,
+    CreationDeclined = 2,
+    CreationFailed = 3,
+    LoadFailed = 4,
+};
+
+QString singleInstanceId()
+{
+    return QString::fromLocal8Bit(qgetenv("DISPLAY")) + QLatin1String("zem-admin-hotkeys");
+}
+
+QIcon windowIcon()
+{
+    const QIcon icon = QIcon::fromTheme(QStringLiteral("preferences-desktop-keyboard-khotkeys"));
+    return icon.isNull() ? QIcon::fromTheme(QStringLiteral("preferences-desktop-keyboard")) : icon;
+}
+
+bool createHotkeysFile(const QString& path)
+{
+    QFile file(path);
+    if (!file.open(QIODevice::WriteOnly | QIODevice::Text))
+        return false;
+    const bool written = file.write(emptyHotkeysFile) == qint64(sizeof(emptyHotkeysFile) - 1);
+    return file.flush() && written;
+}
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+    auto* app = new MyApplication(singleInstanceId(), argc, argv);
+    if (app->isRunning()) {
+        app->sendMessage(QStringLiteral("show"), 5000);
+        delete app;
+        return AnotherInstanceShown;
+    }
+
+    zemInit("2.8.16", "Zem hotkeys editor");
+
+    // The toolkit has taken its own options out of argc and argv by now.
+    QStringList arguments;
+    for (int i = 1; i < argc; ++i)
+        arguments << QString::fromLocal8Bit(argv[i]);
+    if (!arguments.isEmpty()
+        && (arguments.first() == QLatin1String("--help") || arguments.first() == QLatin1String("-h"))) {
+        const QString usage = QObject::tr("Usage: zem-admin-hotkeys filepath - open/create file as hotkeys coll\n");
+        std::fputs(usage.toLocal8Bit().constData(), stdout);
+        std::fputs("\n", stdout);
+        std::fflush(stdout);
+        delete app;
+        return UsageShown;
+    }
+
+    auto* form = new KeysConfForm();
+    form->setWindowIcon(windowIcon());
+
+    QString path;
+    if (arguments.size() == 1) {
+        path = arguments.first();
+        if (path.startsWith(QLatin1Char('%'))) {
+            // An unexpanded field code from a desktop entry: behave as if started without one.
+            path.clear();
+        } else if (!QFile::exists(path)) {
+            const QMessageBox::StandardButton answer = QMessageBox::question(
+                nullptr, QObject::tr("Warning"), QObject::tr("File %1 doesn't exist. Create?").arg(path),
+                QMessageBox::Yes | QMessageBox::No);
+            if (answer != QMessageBox::Yes) {
+                delete form;
+                delete app;
+                return CreationDeclined;
+            }
+        }
+    }
+    if (path.isEmpty())
+        path = userHotkeysFilePath();
+
+    if (!QFile::exists(path) && !createHotkeysFile(path)) {
+        QMessageBox::warning(nullptr, QObject::tr("Attention"), QObject::tr("Can't open/create file:\n%1").arg(path),
+                             QMessageBox::Ok);
+        delete form;
+        delete app;
+        return CreationFailed;
+    }
+
+    if (!form->init(path)) {
+        QMessageBox::warning(nullptr, QObject::tr("Attention"), QObject::tr("Can't parse file:\n%1").arg(path),
+                             QMessageBox::Ok);
+        delete form;
+        delete app;
+        return LoadFailed;
+    }
+
+    QObject::connect(app, &MyApplication::messageReceived, form, &KeysConfForm::messageReceived);
+    QObject::connect(app, &QGuiApplication::lastWindowClosed, app, &QCoreApplication::quit);
+
+    form->show();
+    const int result = app->exec();
+    delete form;
+    delete app;
+    return result;
+}

@@ -1,0 +1,40 @@
+#pragma once
+
+#include <QApplication>
+
+#include <memory>
+
+class QLocalServer;
+class QLockFile;
+
+// A QApplication of which only one instance runs per id. The first instance to take the id's
+// lock serves a local socket; later instances find the lock held and can hand the first one a
+// message, which arrives there through its event loop as messageReceived(). The lock of an
+// instance that crashed is taken over. Ids are private to the user: another account never
+// sees them.
+class SingleInstanceApplication : public QApplication
+{
+    Q_OBJECT
+    Q_DISABLE_COPY(SingleInstanceApplication)
+
+public:
+    SingleInstanceApplication(const QString& id, int& argc, char** argv);
+    ~SingleInstanceApplication() override;
+
+    QString id() const { return appId; }
+    // True when another instance holds this id.
+    bool isRunning() const;
+    // Delivers the message to the running instance; false when none took it in time.
+    bool sendMessage(const QString& message, int timeoutMs);
+
+signals:
+    void messageReceived(const QString& message);
+
+private:
+    void acceptConnections();
+
+    QString appId;
+    QString serverName;
+    std::unique_ptr<QLockFile> lock;
+    QLocalServer* server = nullptr;
+};
