@@ -1,0 +1,49 @@
+#pragma once
+
+#include "kkeysequencewidget.h"
+
+#include <QCoreApplication>
+#include <QKeySequence>
+#include <QTimer>
+
+class KKeySequenceButton;
+class QHBoxLayout;
+class QToolButton;
+
+// The widget's state and the recording logic that its button drives.
+class KKeySequenceWidgetPrivate
+{
+    Q_DECLARE_TR_FUNCTIONS(KKeySequenceWidgetPrivate)
+
+public:
+    explicit KKeySequenceWidgetPrivate(KKeySequenceWidget* q);
+
+    void setup();
+    void beginRecording();
+    void finishRecording();
+    void refreshButtonText();
+    // A key press that Qt could not name: warn, and go back to the sequence before.
+    void unsupportedKey();
+
+    // Whether a key may start a sequence without Control, Alt or Meta.
+    static bool keyAllowedAlone(int key);
+    // The sequence with one more key; a full sequence stays as it is.
+    static QKeySequence appendKey(const QKeySequence& seq, int key);
+
+    static constexpr int releaseDelayMs = 600;
+    static constexpr int longestSequence = 4;
+
+    KKeySequenceWidget* owner;
+    QHBoxLayout* layout = nullptr;
+    KKeySequenceButton* recordButton = nullptr;
+    QToolButton* clearSequenceButton = nullptr;
+    QKeySequence sequence;
+    QKeySequence previousSequence;
+    QTimer releaseTimer;
+    bool bareFirstKeyAllowed = false;
+    quint32 keyCount = 0;
+    quint32 heldModifiers = 0;
+    bool recording = false;
+    bool multiKeyShortcutsAllowed = true;
+    KKeySequenceWidget::ShortcutTypes checkForConflictsAgainst = KKeySequenceWidget::ApplicationShortcuts;
+};
