@@ -3,6 +3,8 @@
 #include <QApplication>
 #include <QByteArray>
 #include <QDir>
+#include <QFileInfo>
+#include <QIcon>
 #include <QLibraryInfo>
 #include <QLocale>
 #include <QTranslator>
@@ -40,6 +42,22 @@ void installTranslator(QTranslator* translator, const QString& name, const QStri
         delete translator;
 }
 
+// Outside a desktop session Qt knows no icon theme, and every themed icon of the editor would be
+// blank; fall back on a complete theme that is installed.
+void useInstalledIconTheme()
+{
+    if (!QIcon::fallbackThemeName().isEmpty() && QIcon::fallbackThemeName() != QLatin1String("hicolor"))
+        return;
+    for (const char* theme : {"breeze", "Adwaita", "oxygen", "Tango"}) {
+        for (const QString& base : QIcon::themeSearchPaths()) {
+            if (QFileInfo::exists(base + QLatin1Char('/') + QLatin1String(theme) + QLatin1String("/index.theme"))) {
+                QIcon::setFallbackThemeName(QLatin1String(theme));
+                return;
+            }
+        }
+    }
+}
+
 } // namespace
 
 void zemInit(const char* version, const char* displayName)
@@ -55,6 +73,7 @@ void zemInit(const char* version, const char* displayName)
     QCoreApplication* app = QCoreApplication::instance();
     if (!app)
         return;
+    useInstalledIconTheme();
     // Qt's own catalogue translates the standard buttons of the message boxes.
     installTranslator(new QTranslator(app), QStringLiteral("qtbase"),
                       QLibraryInfo::location(QLibraryInfo::TranslationsPath));

@@ -9,6 +9,7 @@
 
 #include <QAction>
 #include <QDir>
+#include <QIcon>
 #include <QSettings>
 #include <QX11Info>
 #include <QtTest>
@@ -193,6 +194,10 @@ void TestPlatform::initNamesTheSettingsStore()
     QCOMPARE(QCoreApplication::organizationName(), QStringLiteral("zem"));
     QCOMPARE(QCoreApplication::applicationVersion(), QStringLiteral("2.8.16"));
     QCOMPARE(QGuiApplication::desktopFileName(), QStringLiteral("zem-admin-hotkeys"));
+
+    // Even outside a desktop session the editor's themed icons are found.
+    QVERIFY(!QIcon::fromTheme(QStringLiteral("edit-delete")).isNull());
+    QVERIFY(!QIcon::fromTheme(QStringLiteral("document-save")).isNull());
 
     QSettings settings;
     QCOMPARE(settings.fileName(),
