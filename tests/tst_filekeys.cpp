@@ -30,6 +30,7 @@ private slots:
     void unreadablePaths();
     void writtenForm();
     void nonAsciiTextAndPaths();
+    void defaultSystemFile();
 
 private:
     QTemporaryDir scratch;
@@ -270,6 +271,29 @@ void TestFileKeys::nonAsciiTextAndPaths()
     QCOMPARE(entries.size(), 1);
     QCOMPARE(entries.first().value, QString::fromUtf8("\"echo Grüße ключ\""));
     QCOMPARE(document.toBytes(), content);
+}
+
+void TestFileKeys::defaultSystemFile()
+{
+    HotkeysDocument document;
+    QVERIFY(document.load(QStringLiteral(ZEM_PROJECT_DATA_DIR "/keyshortcutrc")));
+    const QVector<HotkeysEntry> entries = document.entries();
+    QVERIFY(entries.size() >= 20);
+    QSet<QString> keys;
+    for (const HotkeysEntry& entry : entries) {
+        // Every key reads as a real key combination and is written back the same way.
+        const QString stored = ::fromFileKey(entry.key);
+        const QKeySequence sequence = QKeySequence::fromString(stored, QKeySequence::PortableText);
+        QVERIFY2(sequence.count() == 1 && sequence.toString(QKeySequence::PortableText) == stored,
+                 qPrintable(entry.key));
+        QCOMPARE(::toFileKey(ZemKeyServer::KeyQtToKeyStringX(sequence[0])), entry.key);
+        QVERIFY2(!keys.contains(stored.toLower()), qPrintable(entry.key));
+        keys.insert(stored.toLower());
+        const bool function = entry.value.startsWith(QLatin1String("ZEMWM_"));
+        const bool command = entry.value.size() > 2 && entry.value.startsWith(QLatin1Char('"'))
+            && entry.value.endsWith(QLatin1Char('"'));
+        QVERIFY2(function || command, qPrintable(entry.value));
+    }
 }
 
 ZEM_TEST_MAIN(TestFileKeys)
