@@ -1,6 +1,7 @@
 // The project's stand-in for the desktop platform libraries: directories, initialisation, the
 // window-manager command channel and the Help menu.
 #include "hotkeysfile.h"
+#include "stderrcapture.h"
 #include "testenvironment.h"
 #include "xwindows.h"
 #include "zemcore.h"
@@ -16,8 +17,6 @@
 
 #include <X11/Xlib.h>
 
-#include <cstdio>
-#include <unistd.h>
 
 namespace {
 
@@ -50,37 +49,6 @@ private:
             saved.insert(name, qEnvironmentVariableIsSet(name) ? qgetenv(name) : QByteArray());
     }
     QMap<QByteArray, QByteArray> saved;
-};
-
-// Captures what the code under test prints on standard error.
-class StderrCapture
-{
-public:
-    StderrCapture()
-    {
-        std::fflush(stderr);
-        saved = dup(fileno(stderr));
-        file = std::tmpfile();
-        dup2(fileno(file), fileno(stderr));
-    }
-    QByteArray finish()
-    {
-        std::fflush(stderr);
-        dup2(saved, fileno(stderr));
-        close(saved);
-        std::rewind(file);
-        QByteArray text;
-        char buffer[512];
-        size_t n = 0;
-        while ((n = std::fread(buffer, 1, sizeof buffer, file)) > 0)
-            text.append(buffer, int(n));
-        std::fclose(file);
-        return text;
-    }
-
-private:
-    int saved = -1;
-    FILE* file = nullptr;
 };
 
 QString dirOf(ZemDir which)

@@ -3,16 +3,31 @@
 #include "hotkeysdocument.h"
 #include "hotkeysfile.h"
 
+#include <QAction>
+#include <QHash>
+#include <QSet>
+#include <QTreeWidget>
+#include <QTreeWidgetItemIterator>
+
 #include <cstdio>
+
+namespace {
+
+const QString disableValue = QStringLiteral("Disable");
+
+QString unquoted(const QString& value)
+{
+    return value.startsWith(QLatin1Char('"')) ? value.mid(1, value.size() - 2) : value;
+}
+
+} // namespace
 
 bool KeysConfForm::loadFile(const QString& path)
 {
     if (path.isEmpty())
         return false;
 
-    const QString userFile = userHotkeysFilePath();
-    const QString systemPath = path == userFile ? systemHotkeysFilePath() : QString();
-
+    const QString systemPath = path == userHotkeysFilePath() ? systemHotkeysFilePath() : QString();
     HotkeysDocument mainDocument;
     if (!mainDocument.load(path))
         return false;
@@ -26,7 +41,69 @@ bool KeysConfForm::loadFile(const QString& path)
     currentFile = path;
     updateTitle();
     disabledKeys.clear();
+    keysTree->setUpdatesEnabled(false);
+    fillFunctionTree();
+
+    // The first row of every function, and every key bound so far (lower-cased): looked up
+    // once per entry, so that loading stays linear in the size of the files.
+    QHash<QString, QTreeWidgetItem*> firstRowOf;
+    for (QTreeWidgetItemIterator it(keysTree); *it; ++it) {
+        const QString function = (*it)->text(2);
+        if (!function.isEmpty() && !firstRowOf.contains(function))
+            firstRowOf.insert(function, *it);
+    }
+    QSet<QString> boundKeys;
+    QList<QTreeWidgetItem*> commandRows;
+
+    const auto addEntries = [&](const HotkeysDocument& document, const QString& source) {
+        for (const HotkeysEntry& entry : document.entries()) {
+            const QString key = fromFileKey(entry.key);
+            const QString value = unquoted(entry.value);
+            // Whoever bound the key first keeps it: the user's file before the system one.
+            if (!key.isEmpty() && boundKeys.contains(key.toLower()))
+                continue;
+
+            if (value.startsWith(QLatin1String("ZEMWM_"))) {
+                QTreeWidgetItem* first = firstRowOf.value(value);
+                if (!first)
+                    continue;
+                QTreeWidgetItem* row = first;
+                if (!itemKey(first).isEmpty()) {
+                    QTreeWidgetItem* parent = first->parent();
+                    row = new QTreeWidgetItem({first->text(0), QString(), first->text(2)});
+                    parent->insertChild(parent->indexOfChild(first) + 1, row);
+                }
+                setItemKey(row, key);
+                row->setText(3, source);
+            } else {
+                auto* row = new QTreeWidgetItem({value, QString(), QStringLiteral("ExecCommand"), source});
+                setItemKey(row, key);
+                commandRows.append(row);
+                if (value == disableValue && !disabledKeys.contains(itemKey(row)))
+                    disabledKeys.append(itemKey(row));
+            }
+            if (!key.isEmpty())
+                boundKeys.insert(key.toLower());
+        }
+    };
+    addEntries(mainDocument, userSource);
+    addEntries(systemDocument, systemSource);
+
+    // Disabled keys are kept in disabledKeys, not shown as rows. No catalogue row reads
+    // "Disable", so only command rows can be among them.
+    QList<QTreeWidgetItem*> shownCommands;
+    shownCommands.reserve(commandRows.size());
+    for (QTreeWidgetItem* row : qAsConst(commandRows)) {
+        if (row->text(0) == disableValue)
+            delete row;
+        else
+            shownCommands.append(row);
+    }
+    commandGroupItem->addChildren(shownCommands);
+    keysTree->setUpdatesEnabled(true);
 
     modified = false;
+    fileSaveAction->setEnabled(false);
+    fileApplyAction->setEnabled(false);
     return true;
 }

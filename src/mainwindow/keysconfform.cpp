@@ -1,22 +1,320 @@
 #include "keysconfform.h"
 
+#include "kkeysequencewidget.h"
+#include "zemhelpmenu.h"
+
+#include <QAction>
+#include <QButtonGroup>
+#include <QCloseEvent>
+#include <QContextMenuEvent>
+#include <QGroupBox>
+#include <QHBoxLayout>
+#include <QHeaderView>
+#include <QIcon>
+#include <QMenu>
+#include <QMenuBar>
+#include <QRadioButton>
+#include <QSettings>
+#include <QToolBar>
+#include <QTreeWidget>
+#include <QTreeWidgetItemIterator>
+#include <QVBoxLayout>
+
+QString KeysConfForm::userSource;
+QString KeysConfForm::systemSource;
+bool KeysConfForm::modified = false;
+QTreeWidgetItem* KeysConfForm::commandGroupItem = nullptr;
+QMenu* KeysConfForm::popupMenu = nullptr;
+QString KeysConfForm::currentFile;
+QString KeysConfForm::startupFile;
+
+namespace {
+
+QAction* makeAction(QObject* parent, const QString& text, const char* iconName)
+{
+    auto* action = new QAction(text, parent);
+    if (iconName)
+        action->setIcon(QIcon::fromTheme(QLatin1String(iconName)));
+    return action;
+}
+
+} // namespace
+
 KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     : QMainWindow(parent, flags)
 {
     setWindowTitle(tr("Zem hotkeys editor"));
     userSource = tr("user");
     systemSource = tr("system");
+
+    auto* central = new QWidget(this);
+    setCentralWidget(central);
+    mainLayout = new QVBoxLayout(central);
+
+    keysTree = new QTreeWidget(central);
+    keysTree->setObjectName(QStringLiteral("keysTree"));
+    keysTree->setSortingEnabled(false);
+    keysTree->setHeaderLabels({tr("Action"), tr("Current Key"), tr("zem-wm function"), tr("Source")});
+    keysTree->setSizePolicy(QSizePolicy::MinimumExpanding, QSizePolicy::MinimumExpanding);
+    keysTree->setAllColumnsShowFocus(true);
+    keysTree->header()->setContextMenuPolicy(Qt::CustomContextMenu);
+    connect(keysTree->header(), &QHeaderView::customContextMenuRequested, this, &KeysConfForm::showHeaderMenu);
+    mainLayout->addWidget(keysTree);
+
+    keyGroupBox = new QGroupBox(tr("Choose a Key for the Selected Action"), central);
+    keyGroupBox->setObjectName(QStringLiteral("keyGroupBox"));
+    keyGroupBox->setEnabled(false);
+    customKeyRadio = new QRadioButton(tr("Assign Key:"), keyGroupBox);
+    customKeyRadio->setObjectName(QStringLiteral("customKeyRadio"));
+    keyWidget = new KKeySequenceWidget(keyGroupBox);
+    keyWidget->setObjectName(QStringLiteral("keyWidget"));
+    noKeyRadio = new QRadioButton(tr("Clear Key"), keyGroupBox);
+    noKeyRadio->setObjectName(QStringLiteral("noKeyRadio"));
+    auto* radios = new QButtonGroup(this);
+    radios->addButton(customKeyRadio);
+    radios->addButton(noKeyRadio);
+
+    auto* keyLayout = new QHBoxLayout(keyGroupBox);
+    keyLayout->addWidget(customKeyRadio);
+    keyLayout->addWidget(keyWidget);
+    keyLayout->addWidget(noKeyRadio);
+    keyLayout->addStretch(1);
+    mainLayout->addWidget(keyGroupBox);
+
+    fileNewAction = makeAction(this, tr("&New file"), "document-new");
+    fileOpenAction = makeAction(this, tr("&Open..."), "document-open");
+    fileRestoreAction = makeAction(this, tr("&Restore..."), "view-refresh");
+    fileRestoreAction->setToolTip(tr("Restore user's keyshortcutrc file from system one"));
+    fileSaveAction = makeAction(this, tr("&Save"), "document-save");
+    fileSaveAsAction = makeAction(this, tr("Save &As..."), "document-save-as");
+    fileExitAction = makeAction(this, tr("E&xit"), nullptr);
+    fileApplyAction = makeAction(this, tr("Apply"), "dialog-ok-apply");
+    newCommandAction = makeAction(this, tr("&New action"), "edit-add");
+    cloneCommandAction = makeAction(this, tr("&Clone"), "edit-copy");
+    editCommandAction = makeAction(this, tr("&Edit"), "document-properties");
+    editCommandAction->setShortcut(Qt::Key_Return);
+    deleteCommandAction = makeAction(this, tr("&Delete"), "edit-delete");
+    deleteCommandAction->setShortcut(Qt::Key_Delete);
+    const std::pair<QAction*, const char*> names[] = {
+        {fileNewAction, "fileNewAction"},           {fileOpenAction, "fileOpenAction"},
+        {fileRestoreAction, "fileRestoreAction"},   {fileSaveAction, "fileSaveAction"},
+        {fileSaveAsAction, "fileSaveAsAction"},     {fileExitAction, "fileExitAction"},
+        {fileApplyAction, "fileApplyAction"},       {newCommandAction, "newCommandAction"},
+        {cloneCommandAction, "cloneCommandAction"}, {editCommandAction, "editCommandAction"},
+        {deleteCommandAction, "deleteCommandAction"},
+    };
+    for (const auto& [action, name] : names)
+        action->setObjectName(QLatin1String(name));
+
+    menuBar = new QMenuBar(this);
+    fileMenu = new QMenu(tr("&File"), menuBar);
+    fileMenu->addAction(fileNewAction);
+    fileMenu->addAction(fileOpenAction);
+    fileMenu->addAction(fileRestoreAction);
+    fileMenu->addAction(fileSaveAction);
+    fileMenu->addAction(fileSaveAsAction);
+    fileMenu->addAction(fileApplyAction);
+    fileMenu->addSeparator();
+    fileMenu->addAction(fileExitAction);
+    menuBar->addMenu(fileMenu);
+    menuBar->addMenu(new ZemHelpMenu(this));
+    setMenuWidget(menuBar);
+
+    toolBar = new QToolBar(tr("Actions toolbar"), this);
+    toolBar->setObjectName(QStringLiteral("toolbar"));
+    toolBar->addAction(fileNewAction);
+    toolBar->addAction(fileOpenAction);
+    toolBar->addAction(fileRestoreAction);
+    toolBar->addAction(fileSaveAction);
+    toolBar->addAction(fileSaveAsAction);
+    toolBar->addAction(fileApplyAction);
+    toolBar->addSeparator();
+    toolBar->addAction(newCommandAction);
+    toolBar->addAction(cloneCommandAction);
+    toolBar->addAction(editCommandAction);
+    toolBar->addAction(deleteCommandAction);
+    addToolBar(toolBar);
+
+    // The order matters: a recorded key marks the document modified before it is assigned.
+    connect(fileNewAction, &QAction::triggered, this, &KeysConfForm::fileNew);
+    connect(fileOpenAction, &QAction::triggered, this, &KeysConfForm::fileOpen);
+    connect(fileRestoreAction, &QAction::triggered, this, &KeysConfForm::fileRestore);
+    connect(fileSaveAction, &QAction::triggered, this, &KeysConfForm::fileSave);
+    connect(fileSaveAsAction, &QAction::triggered, this, &KeysConfForm::fileSaveAs);
+    connect(fileExitAction, &QAction::triggered, this, &KeysConfForm::fileClose);
+    connect(noKeyRadio, &QRadioButton::clicked, this, &KeysConfForm::opt_nokeys_checked);
+    connect(keysTree, &QTreeWidget::itemDoubleClicked, this, &KeysConfForm::itemDoubleClicked);
+    connect(keysTree, &QTreeWidget::itemSelectionChanged, this, &KeysConfForm::itemSelectionChanged);
+    connect(customKeyRadio, &QRadioButton::clicked, this, &KeysConfForm::opt_customkey_checked);
+    connectKeyWidget();
+    connect(deleteCommandAction, &QAction::triggered, this, &KeysConfForm::deleteCommand);
+    connect(editCommandAction, &QAction::triggered, this, &KeysConfForm::editCommand);
+    connect(newCommandAction, &QAction::triggered, this, &KeysConfForm::newCommand);
+    connect(fileApplyAction, &QAction::triggered, this, &KeysConfForm::fileApply);
+    connect(cloneCommandAction, &QAction::triggered, this, &KeysConfForm::cloneCommand);
 }
 
-KeysConfForm::~KeysConfForm() = default;
+KeysConfForm::~KeysConfForm()
+{
+    saveWindowState();
+    // The class-wide pointers must not outlive the rows and menus they point into.
+    commandGroupItem = nullptr;
+    popupMenu = nullptr;
+}
+
+void KeysConfForm::connectKeyWidget()
+{
+    connect(keyWidget, &KKeySequenceWidget::keySequenceChanged, this, &KeysConfForm::fileChanged);
+    connect(keyWidget, &KKeySequenceWidget::keySequenceChanged, this, &KeysConfForm::capturedKey);
+}
+
+void KeysConfForm::disconnectKeyWidget()
+{
+    disconnect(keyWidget, &KKeySequenceWidget::keySequenceChanged, this, &KeysConfForm::fileChanged);
+    disconnect(keyWidget, &KKeySequenceWidget::keySequenceChanged, this, &KeysConfForm::capturedKey);
+}
 
 bool KeysConfForm::init(QString filepath)
 {
     disabledKeys.clear();
     modified = false;
+    fileSaveAction->setEnabled(false);
+    fileApplyAction->setEnabled(false);
+
+    delete popupMenu;
+    popupMenu = new QMenu(keysTree);
+    popupMenu->setObjectName(QStringLiteral("popupMenu"));
+    popupMenu->addAction(newCommandAction);
+    popupMenu->addAction(cloneCommandAction);
+    popupMenu->addAction(editCommandAction);
+    popupMenu->addAction(deleteCommandAction);
+    setActionsEnabled(nullptr);
+
     const bool loaded = loadFile(filepath);
     startupFile = filepath;
+    restoreWindowState();
     return loaded;
+}
+
+void KeysConfForm::restoreWindowState()
+{
+    QSettings settings;
+    if (settings.contains(QStringLiteral("/MainWinState")))
+        restoreState(settings.value(QStringLiteral("/MainWinState")).toByteArray(), 0);
+    const int width = settings.value(QStringLiteral("/Width"), QStringLiteral("800")).toInt();
+    const int height = settings.value(QStringLiteral("/Height"), QStringLiteral("600")).toInt();
+    if (width != 0 && height != 0)
+        resize(width, height);
+    if (settings.value(QStringLiteral("/Maximized"), QStringLiteral("false")).toBool())
+        setWindowState(windowState() | Qt::WindowMaximized);
+
+    const QByteArray headerState = settings.value(QStringLiteral("/HeaderState")).toByteArray();
+    if (!headerState.isEmpty()) {
+        keysTree->header()->restoreState(headerState);
+    } else {
+        keysTree->resizeColumnToContents(0);
+        keysTree->resizeColumnToContents(1);
+        keysTree->hideColumn(2);
+        keysTree->resizeColumnToContents(3);
+    }
+}
+
+void KeysConfForm::saveWindowState()
+{
+    QSettings settings;
+    if (!isMaximized()) {
+        settings.setValue(QStringLiteral("/Width"), geometry().width());
+        settings.setValue(QStringLiteral("/Height"), geometry().height());
+    }
+    settings.setValue(QStringLiteral("/Maximized"), isMaximized());
+    settings.setValue(QStringLiteral("/MainWinState"), saveState(0));
+    settings.setValue(QStringLiteral("/HeaderState"), keysTree->header()->saveState());
+}
+
+QString KeysConfForm::itemKey(const QTreeWidgetItem* row)
+{
+    return row ? row->data(1, Qt::UserRole).toString() : QString();
+}
+
+void KeysConfForm::setItemKey(QTreeWidgetItem* row, const QString& key)
+{
+    if (!row)
+        return;
+    row->setData(1, Qt::UserRole, key);
+    const QString shown = QKeySequence::fromString(key, QKeySequence::NativeText).toString(QKeySequence::NativeText);
+    row->setText(1, shown.isEmpty() ? key : shown);
+}
+
+void KeysConfForm::itemSelectionChanged()
+{
+    const QList<QTreeWidgetItem*> selected = keysTree->selectedItems();
+    QTreeWidgetItem* row = selected.isEmpty() ? nullptr : selected.first();
+    itemSelected(row);
+    setActionsEnabled(row);
+}
+
+QTreeWidgetItem* KeysConfForm::setActionsEnabled(QTreeWidgetItem* item)
+{
+    const auto enable = [this](bool add, bool edit, bool remove, bool clone) {
+        newCommandAction->setEnabled(add);
+        editCommandAction->setEnabled(edit);
+        deleteCommandAction->setEnabled(remove);
+        cloneCommandAction->setEnabled(clone);
+    };
+
+    if (item && item == commandGroupItem) {
+        enable(true, false, false, false);
+        return item;
+    }
+    QTreeWidgetItem* parent = item ? item->parent() : nullptr;
+    if (!parent) {
+        enable(false, false, false, false);
+        return nullptr;
+    }
+    if (parent == commandGroupItem) {
+        enable(true, true, true, true);
+        return item;
+    }
+    const QString function = item->text(2);
+    if (function.isEmpty())
+        return nullptr;
+    int rowsOfFunction = 0;
+    for (int i = 0; i < parent->childCount(); ++i) {
+        if (parent->child(i)->text(2) == function)
+            ++rowsOfFunction;
+    }
+    enable(false, false, rowsOfFunction >= 2, true);
+    return item;
+}
+
+void KeysConfForm::slotPopupMenu(QTreeWidgetItem* item, QPoint point, int)
+{
+    if (setActionsEnabled(item) && popupMenu)
+        popupMenu->exec(point);
+}
+
+void KeysConfForm::contextMenuEvent(QContextMenuEvent* event)
+{
+    slotPopupMenu(keysTree->currentItem(), event->globalPos(), 0);
+}
+
+void KeysConfForm::showHeaderMenu(const QPoint& position)
+{
+    QMenu menu;
+    QAction* functionColumn = menu.addAction(keysTree->headerItem()->text(2));
+    functionColumn->setCheckable(true);
+    functionColumn->setChecked(!keysTree->isColumnHidden(2));
+    connect(functionColumn, &QAction::triggered, this,
+            [this](bool checked) { keysTree->setColumnHidden(2, !checked); });
+    menu.exec(keysTree->header()->mapToGlobal(position));
+}
+
+void KeysConfForm::closeEvent(QCloseEvent* event)
+{
+    if (askSaveChanges() == QMessageBox::Cancel)
+        event->ignore();
+    else
+        event->accept();
 }
 
 bool KeysConfForm::messageReceived(const QString&)
@@ -26,4 +324,14 @@ bool KeysConfForm::messageReceived(const QString&)
     raise();
     activateWindow();
     return true;
+}
+
+void KeysConfForm::grabKeys()
+{
+}
+
+QTreeWidgetItem* KeysConfForm::targetRow() const
+{
+    const QList<QTreeWidgetItem*> selected = keysTree->selectedItems();
+    return selected.isEmpty() ? keysTree->currentItem() : selected.first();
 }

@@ -1,10 +1,25 @@
 #pragma once
 
 #include <QMainWindow>
+#include <QMessageBox>
 #include <QStringList>
 
-// The editor's main window: the binding tree of window-manager functions and command entries,
-// the key panel below it, and the file commands.
+class KKeySequenceWidget;
+class QAction;
+class QGroupBox;
+class QKeySequence;
+class QMenu;
+class QMenuBar;
+class QPoint;
+class QRadioButton;
+class QToolBar;
+class QTreeWidget;
+class QTreeWidgetItem;
+class QVBoxLayout;
+
+// The editor's main window: the tree of window-manager functions and command entries with
+// their keys, the key panel below it, and the file commands. There is one per process, and its
+// editing state is class-wide.
 class KeysConfForm : public QMainWindow
 {
     Q_OBJECT
@@ -14,26 +29,99 @@ public:
     explicit KeysConfForm(QWidget* parent = nullptr, Qt::WindowFlags flags = Qt::WindowFlags());
     ~KeysConfForm() override;
 
-    // Reads the hotkeys file into the tree; false, with nothing changed, when it cannot be read.
+    // The stored key of a row (QKeySequence portable text; empty: none) and its setter, which
+    // keeps the shown text in step.
+    static QString itemKey(const QTreeWidgetItem* row);
+    static void setItemKey(QTreeWidgetItem* row, const QString& key);
+
+    // Reads a hotkeys file (merged with the system one for the user's file) into the tree;
+    // false, with nothing changed, when it cannot be read.
     bool loadFile(const QString& path);
+    // Writes the tree to the current file; true when there was nothing to write.
+    bool saveFile();
+    void fillFunctionTree();
     void updateTitle();
+
+    QMessageBox::StandardButton askSaveChanges();
+    bool selectFile(bool forOpen);
+    bool copyToCurrentFile(const QString& from);
 
     static bool isModified() { return modified; }
     static QString editedFile() { return currentFile; }
+    static QString startupPath() { return startupFile; }
+    static QTreeWidgetItem* commandGroup() { return commandGroupItem; }
+    static QString userSourceText() { return userSource; }
+    static QString systemSourceText() { return systemSource; }
     QStringList disabledKeyList() const { return disabledKeys; }
 
 public slots:
+    virtual void capturedKey(const QKeySequence& seq);
+    virtual void cloneCommand();
+    virtual void deleteCommand();
+    virtual void editCommand();
+    virtual void fileApply();
     virtual void fileChanged();
+    virtual void fileClose();
+    virtual void fileNew();
+    virtual void fileOpen();
+    virtual void fileRestore();
+    virtual void fileSave();
+    virtual void fileSaveAs();
+    virtual void grabKeys();
     virtual bool init(QString filepath);
+    virtual bool isKeyPresent(const QKeySequence& seq, bool warnuser);
+    virtual void itemDoubleClicked(QTreeWidgetItem* clicked, int col);
+    virtual void itemSelectionChanged();
+    virtual void itemSelected(QTreeWidgetItem* selected);
+    virtual void newCommand();
+    virtual void opt_customkey_checked();
+    virtual void opt_nokeys_checked();
+    virtual void setKey(const QKeySequence& seq);
+    virtual void slotPopupMenu(QTreeWidgetItem* item, QPoint point, int);
+    virtual QTreeWidgetItem* setActionsEnabled(QTreeWidgetItem* item);
+
     bool messageReceived(const QString& message);
 
-private:
-    QStringList disabledKeys;
+protected:
+    void closeEvent(QCloseEvent* event) override;
+    void contextMenuEvent(QContextMenuEvent* event) override;
 
-    // One main window per process: its editing state is class-wide.
+private:
+    void showHeaderMenu(const QPoint& position);
+    void connectKeyWidget();
+    void disconnectKeyWidget();
+    void restoreWindowState();
+    void saveWindowState();
+    // The row the command operations act on: the first selected row, else the current one.
+    QTreeWidgetItem* targetRow() const;
+
+    QTreeWidget* keysTree = nullptr;
+    QGroupBox* keyGroupBox = nullptr;
+    QRadioButton* customKeyRadio = nullptr;
+    KKeySequenceWidget* keyWidget = nullptr;
+    QRadioButton* noKeyRadio = nullptr;
+    QMenuBar* menuBar = nullptr;
+    QToolBar* toolBar = nullptr;
+    QMenu* fileMenu = nullptr;
+    QAction* fileNewAction = nullptr;
+    QAction* fileOpenAction = nullptr;
+    QAction* fileRestoreAction = nullptr;
+    QAction* fileSaveAction = nullptr;
+    QAction* fileSaveAsAction = nullptr;
+    QAction* fileExitAction = nullptr;
+    QAction* fileApplyAction = nullptr;
+    QAction* editCommandAction = nullptr;
+    QAction* newCommandAction = nullptr;
+    QAction* deleteCommandAction = nullptr;
+    QAction* cloneCommandAction = nullptr;
+    QStringList disabledKeys;
+    QVBoxLayout* mainLayout = nullptr;
+
     static QString userSource;
     static QString systemSource;
     static bool modified;
+    static QTreeWidgetItem* commandGroupItem;
+    static QMenu* popupMenu;
     static QString currentFile;
     static QString startupFile;
 };
