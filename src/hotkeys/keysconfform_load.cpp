@@ -9,7 +9,9 @@
 #include <QTreeWidget>
 #include <QTreeWidgetItemIterator>
 
+#include <algorithm>
 #include <cstdio>
+#include <iterator>
 
 namespace {
 
@@ -53,7 +55,11 @@ bool KeysConfForm::loadFile(const QString& path)
             firstRowOf.insert(function, *it);
     }
     QSet<QString> boundKeys;
+    QSet<QString> disabled;
     QList<QTreeWidgetItem*> commandRows;
+    // Further rows of a function, in the order they were read; they join the tree in one go at
+    // the end, since inserting them one by one in the middle of a group costs a shift each.
+    QHash<QTreeWidgetItem*, QList<QTreeWidgetItem*>> furtherRows;
 
     const auto addEntries = [&](const HotkeysDocument& document, const QString& source) {
         for (const HotkeysEntry& entry : document.entries()) {
@@ -69,9 +75,8 @@ bool KeysConfForm::loadFile(const QString& path)
                     continue;
                 QTreeWidgetItem* row = first;
                 if (!itemKey(first).isEmpty()) {
-                    QTreeWidgetItem* parent = first->parent();
                     row = new QTreeWidgetItem({first->text(0), QString(), first->text(2)});
-                    parent->insertChild(parent->indexOfChild(first) + 1, row);
+                    furtherRows[first].append(row);
                 }
                 setItemKey(row, key);
                 row->setText(3, source);
@@ -79,8 +84,10 @@ bool KeysConfForm::loadFile(const QString& path)
                 auto* row = new QTreeWidgetItem({value, QString(), QStringLiteral("ExecCommand"), source});
                 setItemKey(row, key);
                 commandRows.append(row);
-                if (value == disableValue && !disabledKeys.contains(itemKey(row)))
+                if (value == disableValue && !disabled.contains(itemKey(row))) {
+                    disabled.insert(itemKey(row));
                     disabledKeys.append(itemKey(row));
+                }
             }
             if (!key.isEmpty())
                 boundKeys.insert(key.toLower());
@@ -88,6 +95,20 @@ bool KeysConfForm::loadFile(const QString& path)
     };
     addEntries(mainDocument, userSource);
     addEntries(systemDocument, systemSource);
+
+    // A function's further rows follow its first row, the one read last nearest to it.
+    for (int g = 0; g < keysTree->topLevelItemCount() && !furtherRows.isEmpty(); ++g) {
+        QTreeWidgetItem* group = keysTree->topLevelItem(g);
+        const QList<QTreeWidgetItem*> children = group->takeChildren();
+        QList<QTreeWidgetItem*> ordered;
+        ordered.reserve(children.size());
+        for (QTreeWidgetItem* child : children) {
+            ordered.append(child);
+            const QList<QTreeWidgetItem*> extra = furtherRows.take(child);
+            std::copy(extra.crbegin(), extra.crend(), std::back_inserter(ordered));
+        }
+        group->addChildren(ordered);
+    }
 
     // Disabled keys are kept in disabledKeys, not shown as rows. No catalogue row reads
     // "Disable", so only command rows can be among them.
