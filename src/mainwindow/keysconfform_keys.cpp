@@ -33,7 +33,12 @@ void KeysConfForm::itemSelected(QTreeWidgetItem* selected)
         const QKeySequence sequence = QKeySequence::fromString(key, QKeySequence::NativeText);
         const QString portable = sequence.toString(QKeySequence::PortableText);
         const bool danglingPlus = portable.endsWith(QLatin1Char('+')) && !portable.endsWith(QLatin1String("++"));
-        if (key.startsWith(QLatin1Char('#')) || danglingPlus || sequence.isEmpty())
+        // Qt parses a name it does not know as Key_unknown instead of failing, so a sequence
+        // holding one counts as empty too.
+        bool unknownKey = false;
+        for (int i = 0; i < sequence.count(); ++i)
+            unknownKey |= (sequence[i] & ~int(Qt::KeyboardModifierMask)) == Qt::Key_unknown;
+        if (key.startsWith(QLatin1Char('#')) || danglingPlus || sequence.isEmpty() || unknownKey)
             keyWidget->showKeyText(key);
         else
             keyWidget->setKeySequence(sequence, KKeySequenceWidget::NoValidate);

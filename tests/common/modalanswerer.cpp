@@ -2,10 +2,12 @@
 
 #include <QAbstractButton>
 #include <QApplication>
+#include <QFileDialog>
 #include <QPushButton>
 
-ModalAnswerer::ModalAnswerer(QList<QMessageBox::StandardButton> answers)
+ModalAnswerer::ModalAnswerer(QList<QMessageBox::StandardButton> answers, QStringList files)
     : answers(std::move(answers))
+    , files(std::move(files))
 {
     // Polled from the nested event loop of the box itself.
     connect(&timer, &QTimer::timeout, this, &ModalAnswerer::poll);
@@ -14,10 +16,37 @@ ModalAnswerer::ModalAnswerer(QList<QMessageBox::StandardButton> answers)
 
 ModalAnswerer::~ModalAnswerer() = default;
 
+QStringList ModalAnswerer::titles() const
+{
+    QStringList result;
+    for (const Box& box : seen)
+        result << box.title;
+    return result;
+}
+
 void ModalAnswerer::poll()
 {
-    auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
-    if (!box || !box->isVisible() || box->property("zemAnswered").toBool())
+    QWidget* modal = QApplication::activeModalWidget();
+    if (!modal || !modal->isVisible() || modal->property("zemAnswered").toBool())
+        return;
+
+    if (auto* dialog = qobject_cast<QFileDialog*>(modal)) {
+        dialog->setProperty("zemAnswered", true);
+        dialogs.append({dialog->windowTitle(), dialog->directory().absolutePath(),
+                        dialog->acceptMode() == QFileDialog::AcceptSave});
+        const QString file = files.isEmpty() ? QString() : files.takeFirst();
+        if (file.isEmpty()) {
+            dialog->reject();
+        } else {
+            // Accepted as chosen, without the dialog's own questions about replacing a file.
+            dialog->selectFile(file);
+            static_cast<QDialog*>(dialog)->done(QDialog::Accepted);
+        }
+        return;
+    }
+
+    auto* box = qobject_cast<QMessageBox*>(modal);
+    if (!box)
         return;
     box->setProperty("zemAnswered", true);
 

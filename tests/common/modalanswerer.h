@@ -21,18 +21,30 @@ public:
         QMessageBox::StandardButton defaultButton = QMessageBox::NoButton;
     };
 
+    struct FileDialog {
+        QString caption;
+        QString directory;
+        bool forSaving = false;
+    };
+
     // Boxes are answered in the order given; once the list is used up, with the last answer.
-    explicit ModalAnswerer(QList<QMessageBox::StandardButton> answers = {QMessageBox::Ok});
+    // File dialogs take the paths in order; an empty path (or none left) cancels the dialog.
+    explicit ModalAnswerer(QList<QMessageBox::StandardButton> answers = {QMessageBox::Ok},
+                           QStringList files = {});
     ~ModalAnswerer() override;
 
     const QList<Box>& boxes() const { return seen; }
     int count() const { return seen.size(); }
     const Box& last() const { return seen.last(); }
+    QStringList titles() const;
+    const QList<FileDialog>& fileDialogs() const { return dialogs; }
 
 private:
     void poll();
 
     QList<QMessageBox::StandardButton> answers;
+    QStringList files;
     QList<Box> seen;
+    QList<FileDialog> dialogs;
     QTimer timer;
 };
