@@ -3,6 +3,7 @@
 #include <QAbstractButton>
 #include <QApplication>
 #include <QFileDialog>
+#include <QLineEdit>
 #include <QPushButton>
 
 ModalAnswerer::ModalAnswerer(QList<QMessageBox::StandardButton> answers, QStringList files)
@@ -39,7 +40,11 @@ void ModalAnswerer::poll()
             dialog->reject();
         } else {
             // Accepted as chosen, without the dialog's own questions about replacing a file.
-            dialog->selectFile(file);
+            // Typed into the name field in full, as a user may; the directory need not exist.
+            if (auto* name = dialog->findChild<QLineEdit*>(QStringLiteral("fileNameEdit")))
+                name->setText(file);
+            else
+                dialog->selectFile(file);
             static_cast<QDialog*>(dialog)->done(QDialog::Accepted);
         }
         return;
