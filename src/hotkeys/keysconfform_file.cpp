@@ -99,24 +99,35 @@ void KeysConfForm::fileOpen()
     const QString previous = currentFile;
     if (!selectFile(true))
         return;
-    if (!loadFile(currentFile)) {
-        // The tree still shows the previous file: it stays the one that Save writes.
-        const QString unreadable = currentFile;
-        currentFile = previous;
-        updateTitle();
-        QMessageBox::warning(this, tr("Attention"), tr("Can't parse file:\n%1").arg(unreadable), QMessageBox::Ok);
-        return;
-    }
-    fileChanged();
+    if (loadCurrentFileOr(previous))
+        fileChanged();
+}
+
+bool KeysConfForm::loadCurrentFileOr(const QString& previous)
+{
+    if (loadFile(currentFile))
+        return true;
+    // The tree still shows the previous file: it stays the one that Save writes.
+    const QString unreadable = currentFile;
+    currentFile = previous;
+    updateTitle();
+    QMessageBox::warning(this, tr("Attention"), tr("Can't parse file:\n%1").arg(unreadable), QMessageBox::Ok);
+    return false;
+}
+
+bool KeysConfForm::saveFileOrWarn()
+{
+    if (saveFile())
+        return true;
+    QMessageBox::warning(this, tr("Error"), tr("Can't save in file ") + currentFile, QMessageBox::Ok);
+    return false;
 }
 
 void KeysConfForm::fileSave()
 {
-    if (!saveFile()) {
-        QMessageBox::warning(this, tr("Error"), tr("Can't save in file ") + currentFile, QMessageBox::Ok);
-        return;
-    }
-    modified = false;
+    // A failed save keeps the edits marked unsaved, so that they are still offered for saving.
+    if (saveFileOrWarn())
+        modified = false;
 }
 
 void KeysConfForm::fileSaveAs()
@@ -139,23 +150,15 @@ void KeysConfForm::fileRestore()
     const QString previous = currentFile;
     currentFile = userHotkeysFilePath();
     copyToCurrentFile(systemHotkeysFilePath());
-    if (!loadFile(currentFile)) {
-        const QString unreadable = currentFile;
-        currentFile = previous;
-        updateTitle();
-        QMessageBox::warning(this, tr("Attention"), tr("Can't parse file:\n%1").arg(unreadable), QMessageBox::Ok);
-        return;
-    }
-    fileChanged();
+    if (loadCurrentFileOr(previous))
+        fileChanged();
 }
 
 void KeysConfForm::fileApply()
 {
-    if (!saveFile()) {
-        // Nothing is handed to the window manager that was not written.
-        QMessageBox::warning(this, tr("Error"), tr("Can't save in file ") + currentFile, QMessageBox::Ok);
+    // Nothing is handed to the window manager that was not written.
+    if (!saveFileOrWarn())
         return;
-    }
     modified = false;
     fileSaveAction->setEnabled(false);
     fileApplyAction->setEnabled(false);

@@ -88,6 +88,9 @@ protected:
 
 private:
     void showHeaderMenu(const QPoint& position);
+    // Loads currentFile; when it cannot be loaded, says so and makes previous current again.
+    bool loadCurrentFileOr(const QString& previous);
+    bool saveFileOrWarn();
     void connectKeyWidget();
     void disconnectKeyWidget();
     void restoreWindowState();
