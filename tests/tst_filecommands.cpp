@@ -34,6 +34,7 @@ private slots:
     void saveAs();
     void saveDialogCannotCreate();
     void restoreCopiesTheSystemFile();
+    void restoreOffersSaveAsFirst();
     void apply_data();
     void apply();
     void applyWithFailedSave();
@@ -325,6 +326,26 @@ void TestFileCommands::restoreCopiesTheSystemFile()
     QVERIFY(KeysConfForm::isModified());
     QVERIFY(savedActionsEnabled());
     QCOMPARE(readFile(path), QByteArray("[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\n")); // not saved: No
+}
+
+void TestFileCommands::restoreOffersSaveAsFirst()
+{
+    QVERIFY(writeFile(FormFixture::systemPath(), "[ShortCutKeys]\nAlt|F4=ZEMWM_KILL\n"));
+    edit();
+    const QString keep = scratch.filePath(QStringLiteral("kept before restore.rc"));
+    ModalAnswerer answerer({QMessageBox::Yes}, {keep});
+    f.form()->fileRestore();
+    QCOMPARE(answerer.fileDialogs().size(), 1);
+    QCOMPARE(readFile(keep), QByteArray("[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\nCtrl|Alt|l=ZEMWM_LOCK\n"));
+    QCOMPARE(KeysConfForm::editedFile(), FormFixture::userPath());
+    QCOMPARE(f.boundRows(), QStringList{"ZEMWM_KILL=Alt+F4@user"});
+
+    // A cancelled Save As does not stop the restore.
+    edit();
+    ModalAnswerer cancelled({QMessageBox::Yes}, {QString()});
+    f.form()->fileRestore();
+    QCOMPARE(cancelled.fileDialogs().size(), 1);
+    QCOMPARE(f.boundRows(), QStringList{"ZEMWM_KILL=Alt+F4@user"});
 }
 
 void TestFileCommands::apply_data()
