@@ -81,8 +81,9 @@ void KeysConfForm::deleteCommand()
         != QMessageBox::Yes)
         return;
 
-    // A system binding stays switched off once the user's file is saved.
-    if (target->text(3) == systemSource && !disabledKeys.contains(itemKey(target)))
+    // A system binding stays switched off once the user's file is saved. A row without a key
+    // binds nothing, and an empty disabled key would be written as a bogus entry.
+    if (target->text(3) == systemSource && !itemKey(target).isEmpty() && !disabledKeys.contains(itemKey(target)))
         disabledKeys.append(itemKey(target));
     delete target;
     keysTree->setCurrentItem(parent);

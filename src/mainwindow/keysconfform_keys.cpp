@@ -107,8 +107,9 @@ void KeysConfForm::opt_nokeys_checked()
     QTreeWidgetItem* row = keysTree->currentItem();
     if (!row)
         return;
-    // A system binding stays switched off once the user's file is saved.
-    if (row->text(3) == systemSource && !disabledKeys.contains(itemKey(row)))
+    // A system binding stays switched off once the user's file is saved. A row without a key
+    // binds nothing, and an empty disabled key would be written as a bogus entry.
+    if (row->text(3) == systemSource && !itemKey(row).isEmpty() && !disabledKeys.contains(itemKey(row)))
         disabledKeys.append(itemKey(row));
     setItemKey(row, QString());
     row->setText(3, userSource);
