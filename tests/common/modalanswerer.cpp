@@ -34,7 +34,8 @@ void ModalAnswerer::poll()
     if (auto* dialog = qobject_cast<QFileDialog*>(modal)) {
         dialog->setProperty("zemAnswered", true);
         dialogs.append({dialog->windowTitle(), dialog->directory().absolutePath(),
-                        dialog->acceptMode() == QFileDialog::AcceptSave});
+                        dialog->acceptMode() == QFileDialog::AcceptSave, dialog->size(),
+                        dialog->viewMode() == QFileDialog::List});
         const QString file = files.isEmpty() ? QString() : files.takeFirst();
         if (file.isEmpty()) {
             dialog->reject();
@@ -51,8 +52,14 @@ void ModalAnswerer::poll()
     }
 
     auto* box = qobject_cast<QMessageBox*>(modal);
-    if (!box)
+    if (!box) {
+        if (auto* dialog = qobject_cast<QDialog*>(modal); dialog && otherDialogs) {
+            dialog->setProperty("zemAnswered", true);
+            ++othersSeen;
+            otherDialogs(dialog);
+        }
         return;
+    }
     box->setProperty("zemAnswered", true);
 
     Box record;

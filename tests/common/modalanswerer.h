@@ -6,6 +6,10 @@
 #include <QStringList>
 #include <QTimer>
 
+#include <functional>
+
+class QDialog;
+
 // Answers the modal message boxes that code under test opens, so that no test ever waits on
 // one. Each box met is recorded (title, text, parent) and answered with the button asked for.
 class ModalAnswerer : public QObject
@@ -25,6 +29,8 @@ public:
         QString caption;
         QString directory;
         bool forSaving = false;
+        QSize size;
+        bool listView = false;
     };
 
     // Boxes are answered in the order given; once the list is used up, with the last answer.
@@ -38,6 +44,9 @@ public:
     const Box& last() const { return seen.last(); }
     QStringList titles() const;
     const QList<FileDialog>& fileDialogs() const { return dialogs; }
+    // Any other modal dialog is handed to this function, which must close it.
+    void onOtherDialog(std::function<void(QDialog*)> handler) { otherDialogs = std::move(handler); }
+    int otherDialogCount() const { return othersSeen; }
 
 private:
     void poll();
@@ -46,5 +55,7 @@ private:
     QStringList files;
     QList<Box> seen;
     QList<FileDialog> dialogs;
+    std::function<void(QDialog*)> otherDialogs;
+    int othersSeen = 0;
     QTimer timer;
 };
