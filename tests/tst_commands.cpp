@@ -18,6 +18,11 @@ namespace {
 // Answers the command selection dialog: types the text (null: cancels) and records what it
 // was preset with.
 struct CommandAnswer {
+    explicit CommandAnswer(QString typed = QString())
+        : typed(std::move(typed))
+    {
+    }
+
     QString typed;
     QString presetWith;
     int shown = 0;
