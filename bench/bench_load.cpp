@@ -20,8 +20,8 @@
 #include <X11/Xlib.h>
 
 #include <algorithm>
-#include <random>
 #include <cstdio>
+#include <random>
 
 namespace {
 
@@ -30,10 +30,11 @@ QStringList keyNames()
 {
     QStringList names;
     const std::pair<unsigned long, unsigned long> ranges[] = {
-        {0x21, 0x7e},      {0xa1, 0xff},      {0x1a1, 0x1ff},    {0x2a1, 0x2fe},      {0x3a2, 0x3fe},
-        {0x4a1, 0x4df},    {0x5ac, 0x5f2},    {0x6a1, 0x6ff},    {0x7a1, 0x7f9},      {0xcdf, 0xcfa},
-        {0xda1, 0xdf9},    {0xea1, 0xefa},    {0xff50, 0xff58},  {0xffbe, 0xffe0},    {0xff95, 0xff9f},
-        {0x1008ff01, 0x1008ffb0}, {0x8a1, 0x8fe},   {0x9df, 0x9f8},    {0xaa1, 0xafe},      {0xba3, 0xbfc},
+        {0x21, 0x7e},     {0xa1, 0xff},     {0x1a1, 0x1ff},   {0x2a1, 0x2fe},
+        {0x3a2, 0x3fe},   {0x4a1, 0x4df},   {0x5ac, 0x5f2},   {0x6a1, 0x6ff},
+        {0x7a1, 0x7f9},   {0xcdf, 0xcfa},   {0xda1, 0xdf9},   {0xea1, 0xefa},
+        {0xff50, 0xff58}, {0xffbe, 0xffe0}, {0xff95, 0xff9f}, {0x1008ff01, 0x1008ffb0},
+        {0x8a1, 0x8fe},   {0x9df, 0x9f8},   {0xaa1, 0xafe},   {0xba3, 0xbfc},
     };
     for (const auto& [first, last] : ranges) {
         for (unsigned long sym = first; sym <= last; ++sym) {
@@ -52,11 +53,22 @@ QStringList keyNames()
 QStringList distinctKeys(int n, int offset)
 {
     static const QStringList names = keyNames();
-    static const char* modifierSets[] = {
-        "Ctrl|",       "Alt|",           "Super|",           "Ctrl|Alt|",       "Ctrl|Shift|",
-        "Alt|Shift|",  "Ctrl|Super|",    "Alt|Super|",       "Shift|Super|",    "Ctrl|Alt|Shift|",
-        "Ctrl|Alt|Super|", "Ctrl|Shift|Super|", "Alt|Shift|Super|", "Ctrl|Alt|Shift|Super|", "None|",
-        "Shift|"};
+    static const char* modifierSets[] = {"Ctrl|",
+                                         "Alt|",
+                                         "Super|",
+                                         "Ctrl|Alt|",
+                                         "Ctrl|Shift|",
+                                         "Alt|Shift|",
+                                         "Ctrl|Super|",
+                                         "Alt|Super|",
+                                         "Shift|Super|",
+                                         "Ctrl|Alt|Shift|",
+                                         "Ctrl|Alt|Super|",
+                                         "Ctrl|Shift|Super|",
+                                         "Alt|Shift|Super|",
+                                         "Ctrl|Alt|Shift|Super|",
+                                         "None|",
+                                         "Shift|"};
     const int sets = int(std::size(modifierSets));
     QStringList keys;
     for (int i = offset; keys.size() < n; ++i) {
@@ -84,7 +96,10 @@ void writeHotkeysFile(const QString& path, int entries, int keyOffset)
     const QStringList keys = distinctKeys(entries, keyOffset);
     for (int i = 0; i < entries; ++i) {
         switch (i % 10) {
-        case 0: case 1: case 2: case 3: // functions, many with several keys
+        case 0:
+        case 1:
+        case 2:
+        case 3: // functions, many with several keys
             out << keys.at(i) << '=' << functions.at((i / 10 * 4 + i % 10) % functions.size()) << '\n';
             break;
         case 9:
@@ -99,7 +114,8 @@ void writeHotkeysFile(const QString& path, int entries, int keyOffset)
     }
 }
 
-struct Timing {
+struct Timing
+{
     double median;
     double best;
     int rows;
@@ -148,8 +164,8 @@ int main(int argc, char** argv)
     KeysConfForm form;
     const Timing single = timeLoad(form, userEntries, systemEntries, runs);
     const Timing doubled = timeLoad(form, 2 * userEntries, 2 * systemEntries, runs);
-    std::printf("load %d + %d entries: median %.3f s, best %.3f s (%d command rows)\n", userEntries, systemEntries,
-                single.median, single.best, single.rows);
+    std::printf("load %d + %d entries: median %.3f s, best %.3f s (%d command rows)\n", userEntries,
+                systemEntries, single.median, single.best, single.rows);
     std::printf("load %d + %d entries: median %.3f s, best %.3f s (%d command rows)\n", 2 * userEntries,
                 2 * systemEntries, doubled.median, doubled.best, doubled.rows);
     std::printf("doubling the entries took %.2f times as long\n", doubled.median / single.median);

@@ -50,7 +50,8 @@ void useInstalledIconTheme()
         return;
     for (const char* theme : {"breeze", "Adwaita", "oxygen", "Tango"}) {
         for (const QString& base : QIcon::themeSearchPaths()) {
-            if (QFileInfo::exists(base + QLatin1Char('/') + QLatin1String(theme) + QLatin1String("/index.theme"))) {
+            if (QFileInfo::exists(base + QLatin1Char('/') + QLatin1String(theme) +
+                                  QLatin1String("/index.theme"))) {
                 QIcon::setFallbackThemeName(QLatin1String(theme));
                 return;
             }

@@ -4,8 +4,7 @@
 #include <QApplication>
 #include <QMessageBox>
 
-ZemHelpMenu::ZemHelpMenu(QWidget* parent)
-    : QMenu(tr("&Help"), parent)
+ZemHelpMenu::ZemHelpMenu(QWidget* parent) : QMenu(tr("&Help"), parent)
 {
     QAction* about = addAction(tr("About Zem hotkeys editor"));
     about->setObjectName(QStringLiteral("aboutAction"));

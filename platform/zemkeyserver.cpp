@@ -5,12 +5,13 @@
 #include <QString>
 #include <QStringList>
 
-#include <X11/Xlib.h>
 #include <X11/XF86keysym.h>
+#include <X11/Xlib.h>
 
 namespace {
 
-struct ModifierName {
+struct ModifierName
+{
     Qt::KeyboardModifier modifier;
     const char* name;
 };
@@ -32,8 +33,8 @@ Qt::KeyboardModifiers modifierFromName(const QString& name)
         return Qt::AltModifier;
     if (lower == QLatin1String("shift"))
         return Qt::ShiftModifier;
-    if (lower == QLatin1String("super") || lower == QLatin1String("mod4") || lower == QLatin1String("win")
-        || lower == QLatin1String("meta"))
+    if (lower == QLatin1String("super") || lower == QLatin1String("mod4") || lower == QLatin1String("win") ||
+        lower == QLatin1String("meta"))
         return Qt::MetaModifier;
     return Qt::NoModifier;
 }

@@ -27,7 +27,8 @@ namespace {
 constexpr qint64 largestDesktopEntry = 256 * 1024;
 constexpr char desktopEntrySection[] = "Desktop Entry";
 
-struct MainCategory {
+struct MainCategory
+{
     const char* name;
     const char* title;
 };
@@ -74,8 +75,8 @@ public:
         const QByteArray bytes = file.read(largestDesktopEntry + 1);
         if (bytes.size() > largestDesktopEntry || bytes.contains('\0'))
             return false;
-        return ini.LoadData(bytes.constData(), size_t(bytes.size())) >= 0
-            && ini.GetSectionSize(desktopEntrySection) > 0;
+        return ini.LoadData(bytes.constData(), size_t(bytes.size())) >= 0 &&
+               ini.GetSectionSize(desktopEntrySection) > 0;
     }
 
     QString value(const char* key) const
@@ -89,8 +90,9 @@ public:
     QString localized(const char* key) const
     {
         const QString locale = QLocale().name();
-        const QStringList candidates{QStringLiteral("%1[%2]").arg(QLatin1String(key), locale),
-                                     QStringLiteral("%1[%2]").arg(QLatin1String(key), locale.section('_', 0, 0))};
+        const QStringList candidates{
+            QStringLiteral("%1[%2]").arg(QLatin1String(key), locale),
+            QStringLiteral("%1[%2]").arg(QLatin1String(key), locale.section('_', 0, 0))};
         for (const QString& candidate : candidates) {
             const char* found = ini.GetValue(desktopEntrySection, candidate.toUtf8().constData(), nullptr);
             if (found && *found)
@@ -148,8 +150,8 @@ QVector<DesktopApplication> installedApplications()
             DesktopEntry entry;
             if (!entry.load(path))
                 continue;
-            if (entry.value("Type").trimmed() != QLatin1String("Application") || entry.flag("NoDisplay")
-                || entry.flag("Hidden"))
+            if (entry.value("Type").trimmed() != QLatin1String("Application") || entry.flag("NoDisplay") ||
+                entry.flag("Hidden"))
                 continue;
             DesktopApplication application;
             application.id = id;
@@ -165,9 +167,10 @@ QVector<DesktopApplication> installedApplications()
             applications.append(application);
         }
     }
-    std::sort(applications.begin(), applications.end(), [](const DesktopApplication& a, const DesktopApplication& b) {
-        return QString::localeAwareCompare(a.name, b.name) < 0;
-    });
+    std::sort(applications.begin(), applications.end(),
+              [](const DesktopApplication& a, const DesktopApplication& b) {
+                  return QString::localeAwareCompare(a.name, b.name) < 0;
+              });
     return applications;
 }
 
@@ -193,8 +196,7 @@ QString execWithoutFieldCodes(const QString& exec)
     return result.trimmed();
 }
 
-ZemMenuDialog::ZemMenuDialog(QWidget* parent)
-    : QDialog(parent)
+ZemMenuDialog::ZemMenuDialog(QWidget* parent) : QDialog(parent)
 {
     setWindowTitle(tr("Choose an application"));
 
@@ -272,9 +274,9 @@ void ZemMenuDialog::applyFilter(const QString& text)
         int shown = 0;
         for (int i = 0; i < group->childCount(); ++i) {
             QTreeWidgetItem* item = group->child(i);
-            const bool match = wanted.isEmpty() || item->text(0).contains(wanted, Qt::CaseInsensitive)
-                || item->text(1).contains(wanted, Qt::CaseInsensitive)
-                || item->data(0, Qt::UserRole).toString().contains(wanted, Qt::CaseInsensitive);
+            const bool match = wanted.isEmpty() || item->text(0).contains(wanted, Qt::CaseInsensitive) ||
+                               item->text(1).contains(wanted, Qt::CaseInsensitive) ||
+                               item->data(0, Qt::UserRole).toString().contains(wanted, Qt::CaseInsensitive);
             item->setHidden(!match);
             shown += match ? 1 : 0;
         }

@@ -12,7 +12,8 @@ class QTreeWidget;
 class QTreeWidgetItem;
 
 // One application of the desktop menu, as its desktop entry describes it.
-struct DesktopApplication {
+struct DesktopApplication
+{
     QString id;       // desktop-file id: path below applications/, "/" turned into "-"
     QString name;     // localized Name
     QString comment;  // localized Comment or GenericName

@@ -64,9 +64,9 @@ void TestCatalogue::groupTitles()
             ++sizes.last();
         }
     }
-    QCOMPARE(titles, (QStringList{"Window decoration (on/off)", "Taskbar", "Desktop Icon", "Keyboard", "Pager",
-                                  "Paging", "Search panel", "Menu", "Rearrangement", "Window placement",
-                                  "Window focus", "Window Manager"}));
+    QCOMPARE(titles, (QStringList{"Window decoration (on/off)", "Taskbar", "Desktop Icon", "Keyboard",
+                                  "Pager", "Paging", "Search panel", "Menu", "Rearrangement",
+                                  "Window placement", "Window focus", "Window Manager"}));
     QCOMPARE(sizes, (QList<int>{9, 15, 28, 3, 14, 4, 1, 5, 16, 34, 7, 18}));
 }
 
@@ -76,13 +76,20 @@ void TestCatalogue::descriptions_data()
     QTest::addColumn<QString>("description");
     QTest::addColumn<int>("code");
 
-    QTest::newRow("first") << "ZEMWM_TOGGLE_BORDER" << "toggle switch of a border" << 48;
-    QTest::newRow("restore all") << "ZEMWM_RESTORE_ALL" << "restore all windows" << 76;
-    QTest::newRow("toggle minimize all") << "ZEMWM_TOGGLE_MINIMIZE_ALL" << "minimize/restore all windows" << 74;
-    QTest::newRow("folder, as spelled") << "ZEMWM_ICON_FOLDER_CREATE" << "cretae a folder" << 140;
-    QTest::newRow("pager bottom, as spelled") << "ZEMWM_DISABLE_ONTOP_PAGER" << "pager on botton of all" << 0;
-    QTest::newRow("kill, as spelled") << "ZEMWM_KILL" << "close a window forcely" << 43;
-    QTest::newRow("last") << "ZEMWM_NEXT_WALLPAPER" << "next wallpaper" << 0;
+    QTest::newRow("first") << "ZEMWM_TOGGLE_BORDER"
+                           << "toggle switch of a border" << 48;
+    QTest::newRow("restore all") << "ZEMWM_RESTORE_ALL"
+                                 << "restore all windows" << 76;
+    QTest::newRow("toggle minimize all") << "ZEMWM_TOGGLE_MINIMIZE_ALL"
+                                         << "minimize/restore all windows" << 74;
+    QTest::newRow("folder, as spelled") << "ZEMWM_ICON_FOLDER_CREATE"
+                                        << "cretae a folder" << 140;
+    QTest::newRow("pager bottom, as spelled") << "ZEMWM_DISABLE_ONTOP_PAGER"
+                                              << "pager on botton of all" << 0;
+    QTest::newRow("kill, as spelled") << "ZEMWM_KILL"
+                                      << "close a window forcely" << 43;
+    QTest::newRow("last") << "ZEMWM_NEXT_WALLPAPER"
+                          << "next wallpaper" << 0;
 }
 
 void TestCatalogue::descriptions()

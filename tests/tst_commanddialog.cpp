@@ -62,11 +62,16 @@ void TestCommandDialog::setCommandSelectsArguments_data()
     QTest::addColumn<QString>("command");
     QTest::addColumn<QString>("selected");
 
-    QTest::newRow("program and arguments") << "xterm -e top" << "-e top";
-    QTest::newRow("program alone") << "xterm" << "";
-    QTest::newRow("leading blank") << " xterm -e top" << "";
-    QTest::newRow("two blanks after the program") << "xterm  -e" << " -e";
-    QTest::newRow("trailing blank only") << "xterm " << "";
+    QTest::newRow("program and arguments") << "xterm -e top"
+                                           << "-e top";
+    QTest::newRow("program alone") << "xterm"
+                                   << "";
+    QTest::newRow("leading blank") << " xterm -e top"
+                                   << "";
+    QTest::newRow("two blanks after the program") << "xterm  -e"
+                                                  << " -e";
+    QTest::newRow("trailing blank only") << "xterm "
+                                         << "";
 }
 
 void TestCommandDialog::setCommandSelectsArguments()
@@ -86,7 +91,8 @@ void TestCommandDialog::acceptSimplifiesWhiteSpace()
 {
     SelectCommandDialog dialog(nullptr);
     dialog.findChild<QLineEdit*>("commandLineEdit")->setText(QStringLiteral("  xterm \t -e    top  "));
-    QTimer::singleShot(0, &dialog, [&] { dialog.findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok)->click(); });
+    QTimer::singleShot(0, &dialog,
+                       [&] { dialog.findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok)->click(); });
     QCOMPARE(dialog.exec(), int(QDialog::Accepted));
     QCOMPARE(dialog.command(), QStringLiteral("xterm -e top"));
     QCOMPARE(dialog.findChild<QLineEdit*>("commandLineEdit")->text(), QStringLiteral("xterm -e top"));
@@ -129,22 +135,22 @@ void TestCommandDialog::sizeRemembered()
 
 void TestCommandDialog::executableLoop_data()
 {
-    QTest::addColumn<QStringList>("choices");     // files chosen in turn, relative to the scratch dir
+    QTest::addColumn<QStringList>("choices"); // files chosen in turn, relative to the scratch dir
     QTest::addColumn<Answers>("answers");
     QTest::addColumn<QStringList>("boxTitles");
-    QTest::addColumn<QString>("command");         // relative to the scratch dir; empty: unchanged
+    QTest::addColumn<QString>("command"); // relative to the scratch dir; empty: unchanged
 
     QTest::newRow("missing file, Cancel") << QStringList{"no-such-program"} << Answers{QMessageBox::Cancel}
                                           << QStringList{"File doesn't exist"} << "";
     QTest::newRow("not executable, Cancel") << QStringList{"plain.txt"} << Answers{QMessageBox::Cancel}
                                             << QStringList{"File isn't executable"} << "";
-    QTest::newRow("directory is no program") << QStringList{"bin"} << Answers{QMessageBox::Cancel}
-                                             << QStringList{"File isn't executable"} << "";
-    QTest::newRow("missing, then another choice") << QStringList{"no-such-program", "bin/tool"}
-                                                  << Answers{QMessageBox::Yes}
-                                                  << QStringList{"File doesn't exist"} << "bin/tool";
-    QTest::newRow("link to an executable is resolved") << QStringList{"links/tool link"}
-                                                       << Answers{} << QStringList() << "bin/tool";
+    QTest::newRow("directory is no program")
+        << QStringList{"bin"} << Answers{QMessageBox::Cancel} << QStringList{"File isn't executable"} << "";
+    QTest::newRow("missing, then another choice")
+        << QStringList{"no-such-program", "bin/tool"} << Answers{QMessageBox::Yes}
+        << QStringList{"File doesn't exist"} << "bin/tool";
+    QTest::newRow("link to an executable is resolved")
+        << QStringList{"links/tool link"} << Answers{} << QStringList() << "bin/tool";
     QTest::newRow("file dialog cancelled") << QStringList{""} << Answers{} << QStringList() << "";
 }
 

@@ -17,11 +17,9 @@ namespace {
 
 // Answers the command selection dialog: types the text (null: cancels) and records what it
 // was preset with.
-struct CommandAnswer {
-    explicit CommandAnswer(QString typed = QString())
-        : typed(std::move(typed))
-    {
-    }
+struct CommandAnswer
+{
+    explicit CommandAnswer(QString typed = QString()) : typed(std::move(typed)) {}
 
     QString typed;
     QString presetWith;
@@ -73,7 +71,8 @@ private:
 
 void TestCommands::init()
 {
-    QVERIFY(f.openUserFile("Ctrl|Alt|t=\"xterm -e top\"\nAlt|F5=ZEMWM_LOCK\n", "Ctrl|Alt|c=\"xclock\"\nAlt|F4=ZEMWM_CLOSE\n"));
+    QVERIFY(f.openUserFile("Ctrl|Alt|t=\"xterm -e top\"\nAlt|F5=ZEMWM_LOCK\n",
+                           "Ctrl|Alt|c=\"xclock\"\nAlt|F4=ZEMWM_CLOSE\n"));
     f.form()->show();
     f.form()->activateWindow();
     QVERIFY(QTest::qWaitForWindowActive(f.form()));
@@ -87,7 +86,8 @@ void TestCommands::cleanup()
 QString TestCommands::enabledCommandActions() const
 {
     QString seen;
-    const char* names[] = {"newCommandAction", "editCommandAction", "deleteCommandAction", "cloneCommandAction"};
+    const char* names[] = {"newCommandAction", "editCommandAction", "deleteCommandAction",
+                           "cloneCommandAction"};
     for (int i = 0; i < 4; ++i)
         seen += f.action(names[i])->isEnabled() ? QChar("NEDC"[i]) : QChar('-');
     return seen;
@@ -217,7 +217,8 @@ void TestCommands::doubleClickAndReturn()
         const int column = how.endsWith('0') ? 0 : 3;
         f.tree()->showColumn(column);
         const QRect rect = f.tree()->visualItemRect(row);
-        const QPoint at(f.tree()->columnViewportPosition(column) + f.tree()->columnWidth(column) / 2, rect.center().y());
+        const QPoint at(f.tree()->columnViewportPosition(column) + f.tree()->columnWidth(column) / 2,
+                        rect.center().y());
         // QTest's double click on a widget is the second click alone; the first comes before it.
         QTest::mouseClick(viewport, Qt::LeftButton, Qt::NoModifier, at);
         QTest::mouseDClick(viewport, Qt::LeftButton, Qt::NoModifier, at);

@@ -112,7 +112,7 @@ void TestFileCommands::unsavedChangesQuestion_data()
 {
     QTest::addColumn<QString>("command");
     QTest::addColumn<QMessageBox::StandardButton>("answer");
-    QTest::addColumn<bool>("goesOn");   // the file dialog was shown
+    QTest::addColumn<bool>("goesOn"); // the file dialog was shown
     QTest::addColumn<bool>("saved");
 
     for (const char* command : {"New", "Open"}) {
@@ -292,8 +292,9 @@ void TestFileCommands::saveAs()
     ModalAnswerer answerer({}, {target});
     f.form()->fileSaveAs();
     QCOMPARE(answerer.count(), 0);
-    QCOMPARE(readFile(target), modified ? QByteArray("[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\nCtrl|Alt|l=ZEMWM_LOCK\n")
-                                        : readFile(path));
+    QCOMPARE(readFile(target), modified
+                                   ? QByteArray("[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\nCtrl|Alt|l=ZEMWM_LOCK\n")
+                                   : readFile(path));
     QCOMPARE(KeysConfForm::editedFile(), target);
     QCOMPARE(f.form()->windowTitle(), QStringLiteral("Zem hotkeys editor - saved as 'copy'.rc"));
     QVERIFY(!KeysConfForm::isModified());
@@ -375,13 +376,15 @@ void TestFileCommands::apply()
     f.form()->fileApply();
     if (otherFile) {
         QCOMPARE(answerer.titles(), QStringList{"Warning"});
-        QCOMPARE(answerer.last().text, QStringLiteral("You current file is \"%1\".\nAfter restart zem-wm will use \"%2\".")
-                                           .arg(applied, path));
+        QCOMPARE(answerer.last().text,
+                 QStringLiteral("You current file is \"%1\".\nAfter restart zem-wm will use \"%2\".")
+                     .arg(applied, path));
     } else {
         QCOMPARE(answerer.count(), 0);
     }
     QVERIFY(readFile(applied).contains("Ctrl|Alt|l=ZEMWM_LOCK\n"));
-    QTRY_COMPARE(x.rootProperty("_ZEMWM_COMMAND"), "ZEMWM_UPDATE_VAL SCKeysFile " + applied.toLocal8Bit() + '\n');
+    QTRY_COMPARE(x.rootProperty("_ZEMWM_COMMAND"),
+                 "ZEMWM_UPDATE_VAL SCKeysFile " + applied.toLocal8Bit() + '\n');
     x.deleteRootProperty("_ZEMWM_COMMAND");
 }
 

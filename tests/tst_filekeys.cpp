@@ -41,19 +41,32 @@ void TestFileKeys::toFileKey_data()
     QTest::addColumn<QString>("keyString");
     QTest::addColumn<QString>("fileKey");
 
-    QTest::newRow("alt-x lower-cased") << "Alt+X" << "Alt|x";
-    QTest::newRow("plain letter gets None") << "Q" << "None|q";
-    QTest::newRow("function key keeps case") << "F5" << "None|F5";
-    QTest::newRow("three modifiers") << "Ctrl+Alt+T" << "Ctrl|Alt|t";
-    QTest::newRow("super with named key") << "Super+Print" << "Super|Print";
-    QTest::newRow("shift tab") << "Shift+Tab" << "Shift|Tab";
-    QTest::newRow("multimedia key") << "XF86AudioMute" << "None|XF86AudioMute";
-    QTest::newRow("space keeps its name") << "Ctrl+space" << "Ctrl|space";
-    QTest::newRow("placeholder") << "None0" << "None|None0";
-    QTest::newRow("placeholder twelve") << "None12" << "None|None12";
-    QTest::newRow("non-ascii letter lower-cased") << QString::fromUtf8("Ctrl+Ä") << QString::fromUtf8("Ctrl|ä");
-    QTest::newRow("multi-letter key not lower-cased") << "Alt+Escape" << "Alt|Escape";
-    QTest::newRow("all four modifiers") << "Ctrl+Alt+Shift+Super+Delete" << "Ctrl|Alt|Shift|Super|Delete";
+    QTest::newRow("alt-x lower-cased") << "Alt+X"
+                                       << "Alt|x";
+    QTest::newRow("plain letter gets None") << "Q"
+                                            << "None|q";
+    QTest::newRow("function key keeps case") << "F5"
+                                             << "None|F5";
+    QTest::newRow("three modifiers") << "Ctrl+Alt+T"
+                                     << "Ctrl|Alt|t";
+    QTest::newRow("super with named key") << "Super+Print"
+                                          << "Super|Print";
+    QTest::newRow("shift tab") << "Shift+Tab"
+                               << "Shift|Tab";
+    QTest::newRow("multimedia key") << "XF86AudioMute"
+                                    << "None|XF86AudioMute";
+    QTest::newRow("space keeps its name") << "Ctrl+space"
+                                          << "Ctrl|space";
+    QTest::newRow("placeholder") << "None0"
+                                 << "None|None0";
+    QTest::newRow("placeholder twelve") << "None12"
+                                        << "None|None12";
+    QTest::newRow("non-ascii letter lower-cased")
+        << QString::fromUtf8("Ctrl+Ä") << QString::fromUtf8("Ctrl|ä");
+    QTest::newRow("multi-letter key not lower-cased") << "Alt+Escape"
+                                                      << "Alt|Escape";
+    QTest::newRow("all four modifiers") << "Ctrl+Alt+Shift+Super+Delete"
+                                        << "Ctrl|Alt|Shift|Super|Delete";
 }
 
 void TestFileKeys::toFileKey()
@@ -68,28 +81,50 @@ void TestFileKeys::fromFileKey_data()
     QTest::addColumn<QString>("fileKey");
     QTest::addColumn<QString>("storedKey");
 
-    QTest::newRow("modifiers and letter") << "Ctrl|Alt|t" << "Ctrl+Alt+T";
-    QTest::newRow("None| dropped") << "None|Q" << "Q";
-    QTest::newRow("bare function key") << "F5" << "F5";
-    QTest::newRow("None|F5 same as F5") << "None|F5" << "F5";
-    QTest::newRow("placeholder None|None0") << "None|None0" << "";
-    QTest::newRow("placeholder None0") << "None0" << "";
-    QTest::newRow("placeholder None|None12") << "None|None12" << "";
-    QTest::newRow("quoted key") << "\"Ctrl|a\"" << "Ctrl+A";
-    QTest::newRow("upper-case modifiers") << "ALT|F5" << "Alt+F5";
-    QTest::newRow("upper-case letter") << "Alt|X" << "Alt+X";
-    QTest::newRow("lower-case function key") << "alt|f5" << "Alt+F5";
-    QTest::newRow("calculator") << "None|XF86Calculator" << "Calculator";
-    QTest::newRow("calculator without None") << "XF86Calculator" << "Calculator";
-    QTest::newRow("super is meta") << "Super|e" << "Meta+E";
-    QTest::newRow("alias Mod4 and Control") << "Mod4|Control|z" << "Meta+Ctrl+Z";
-    QTest::newRow("alias Win and Mod1") << "Win|Mod1|Delete" << "Meta+Alt+Del";
-    QTest::newRow("keypad digit") << "None|KP_1" << "Num+1";
-    QTest::newRow("space") << "Ctrl|space" << "Ctrl+Space";
-    QTest::newRow("shift tab") << "Shift|Tab" << "Shift+Tab";
-    QTest::newRow("unknown key kept as text") << "Ctrl|NoSuchKey" << "Ctrl+NoSuchKey";
-    QTest::newRow("unknown modifier kept as text") << "Hyper|x" << "Hyper+x";
-    QTest::newRow("every None+ removed") << "None|None|F2" << "F2";
+    QTest::newRow("modifiers and letter") << "Ctrl|Alt|t"
+                                          << "Ctrl+Alt+T";
+    QTest::newRow("None| dropped") << "None|Q"
+                                   << "Q";
+    QTest::newRow("bare function key") << "F5"
+                                       << "F5";
+    QTest::newRow("None|F5 same as F5") << "None|F5"
+                                        << "F5";
+    QTest::newRow("placeholder None|None0") << "None|None0"
+                                            << "";
+    QTest::newRow("placeholder None0") << "None0"
+                                       << "";
+    QTest::newRow("placeholder None|None12") << "None|None12"
+                                             << "";
+    QTest::newRow("quoted key") << "\"Ctrl|a\""
+                                << "Ctrl+A";
+    QTest::newRow("upper-case modifiers") << "ALT|F5"
+                                          << "Alt+F5";
+    QTest::newRow("upper-case letter") << "Alt|X"
+                                       << "Alt+X";
+    QTest::newRow("lower-case function key") << "alt|f5"
+                                             << "Alt+F5";
+    QTest::newRow("calculator") << "None|XF86Calculator"
+                                << "Calculator";
+    QTest::newRow("calculator without None") << "XF86Calculator"
+                                             << "Calculator";
+    QTest::newRow("super is meta") << "Super|e"
+                                   << "Meta+E";
+    QTest::newRow("alias Mod4 and Control") << "Mod4|Control|z"
+                                            << "Meta+Ctrl+Z";
+    QTest::newRow("alias Win and Mod1") << "Win|Mod1|Delete"
+                                        << "Meta+Alt+Del";
+    QTest::newRow("keypad digit") << "None|KP_1"
+                                  << "Num+1";
+    QTest::newRow("space") << "Ctrl|space"
+                           << "Ctrl+Space";
+    QTest::newRow("shift tab") << "Shift|Tab"
+                               << "Shift+Tab";
+    QTest::newRow("unknown key kept as text") << "Ctrl|NoSuchKey"
+                                              << "Ctrl+NoSuchKey";
+    QTest::newRow("unknown modifier kept as text") << "Hyper|x"
+                                                   << "Hyper+x";
+    QTest::newRow("every None+ removed") << "None|None|F2"
+                                         << "F2";
 }
 
 void TestFileKeys::fromFileKey()
@@ -125,7 +160,8 @@ void TestFileKeys::qtKeyRoundTrip_data()
     QTest::newRow("arrow") << int(Qt::CTRL | Qt::ALT | Qt::Key_Left) << "Ctrl|Alt|Left";
 
     // Every combination of the four modifiers, written in the fixed order.
-    const struct {
+    const struct
+    {
         int bit;
         const char* name;
     } modifiers[] = {{Qt::CTRL, "Ctrl"}, {Qt::ALT, "Alt"}, {Qt::SHIFT, "Shift"}, {Qt::META, "Super"}};
@@ -160,14 +196,22 @@ void TestFileKeys::keyStringXToQt_data()
     QTest::addColumn<QString>("keyString");
     QTest::addColumn<QString>("portable");
 
-    QTest::newRow("lower-case modifiers") << "ctrl+alt+t" << "Ctrl+Alt+T";
-    QTest::newRow("upper-case modifiers") << "CTRL+SHIFT+F3" << "Ctrl+Shift+F3";
-    QTest::newRow("meta alias") << "Meta+x" << "Meta+X";
-    QTest::newRow("multimedia") << "XF86AudioRaiseVolume" << "Volume Up";
-    QTest::newRow("empty") << "" << "";
-    QTest::newRow("unknown key") << "Ctrl+Frobnicate" << "";
-    QTest::newRow("unknown modifier") << "Hyper+x" << "";
-    QTest::newRow("modifier without key") << "Ctrl+" << "";
+    QTest::newRow("lower-case modifiers") << "ctrl+alt+t"
+                                          << "Ctrl+Alt+T";
+    QTest::newRow("upper-case modifiers") << "CTRL+SHIFT+F3"
+                                          << "Ctrl+Shift+F3";
+    QTest::newRow("meta alias") << "Meta+x"
+                                << "Meta+X";
+    QTest::newRow("multimedia") << "XF86AudioRaiseVolume"
+                                << "Volume Up";
+    QTest::newRow("empty") << ""
+                           << "";
+    QTest::newRow("unknown key") << "Ctrl+Frobnicate"
+                                 << "";
+    QTest::newRow("unknown modifier") << "Hyper+x"
+                                      << "";
+    QTest::newRow("modifier without key") << "Ctrl+"
+                                          << "";
 }
 
 void TestFileKeys::keyStringXToQt()
@@ -194,16 +238,15 @@ void TestFileKeys::loadDocument_data()
 
     QTest::newRow("section only") << QByteArray("[ShortCutKeys]\n") << true << QStringList();
     QTest::newRow("empty file refused") << QByteArray() << false << QStringList();
-    QTest::newRow("other section refused") << QByteArray("[Other]\nAlt|x=ZEMWM_CLOSE\n") << false
-                                           << QStringList();
+    QTest::newRow("other section refused")
+        << QByteArray("[Other]\nAlt|x=ZEMWM_CLOSE\n") << false << QStringList();
     QTest::newRow("ordinary entries sorted by key")
         << QByteArray("[ShortCutKeys]\nNone|F5=ZEMWM_LOCK\nAlt|x=\"xterm\"\n") << true
         << QStringList{"Alt|x=\"xterm\"", "None|F5=ZEMWM_LOCK"};
-    QTest::newRow("byte-order mark skipped")
-        << QByteArray("\xEF\xBB\xBF[ShortCutKeys]\nAlt|x=ZEMWM_CLOSE\n") << true
-        << QStringList{"Alt|x=ZEMWM_CLOSE"};
-    QTest::newRow("section name in other case") << QByteArray("[shortcutkeys]\nAlt|x=ZEMWM_CLOSE\n") << true
-                                                << QStringList{"Alt|x=ZEMWM_CLOSE"};
+    QTest::newRow("byte-order mark skipped") << QByteArray("\xEF\xBB\xBF[ShortCutKeys]\nAlt|x=ZEMWM_CLOSE\n")
+                                             << true << QStringList{"Alt|x=ZEMWM_CLOSE"};
+    QTest::newRow("section name in other case")
+        << QByteArray("[shortcutkeys]\nAlt|x=ZEMWM_CLOSE\n") << true << QStringList{"Alt|x=ZEMWM_CLOSE"};
     QTest::newRow("same key in other case: later line counts, first place kept")
         << QByteArray("[ShortCutKeys]\nalt|X=ZEMWM_CLOSE\nBeta=x\nALT|x=ZEMWM_KILL\n") << true
         << QStringList{"alt|X=ZEMWM_KILL", "Beta=x"};
@@ -212,8 +255,8 @@ void TestFileKeys::loadDocument_data()
         << true << QStringList{"Alt|x=ZEMWM_CLOSE"};
     QTest::newRow("ascii case-insensitive order")
         << QByteArray("[ShortCutKeys]\nb=1\nA=2\nc=3\n") << true << QStringList{"A=2", "b=1", "c=3"};
-    QTest::newRow("line without value") << QByteArray("[ShortCutKeys]\nAlt|x=\n") << true
-                                        << QStringList{"Alt|x="};
+    QTest::newRow("line without value")
+        << QByteArray("[ShortCutKeys]\nAlt|x=\n") << true << QStringList{"Alt|x="};
     QTest::newRow("crlf line ends") << QByteArray("[ShortCutKeys]\r\nAlt|x=ZEMWM_CLOSE\r\n") << true
                                     << QStringList{"Alt|x=ZEMWM_CLOSE"};
 }
@@ -290,8 +333,8 @@ void TestFileKeys::defaultSystemFile()
         QVERIFY2(!keys.contains(stored.toLower()), qPrintable(entry.key));
         keys.insert(stored.toLower());
         const bool function = entry.value.startsWith(QLatin1String("ZEMWM_"));
-        const bool command = entry.value.size() > 2 && entry.value.startsWith(QLatin1Char('"'))
-            && entry.value.endsWith(QLatin1Char('"'));
+        const bool command = entry.value.size() > 2 && entry.value.startsWith(QLatin1Char('"')) &&
+                             entry.value.endsWith(QLatin1Char('"'));
         QVERIFY2(function || command, qPrintable(entry.value));
     }
 }

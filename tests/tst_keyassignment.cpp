@@ -57,26 +57,28 @@ void TestKeyAssignment::assign_data()
     QTest::addColumn<QString>("conflict"); // the box's text; empty when the key is free
     QTest::addColumn<QStringList>("disabledAfter");
 
-    const QByteArray entries = "Alt|F4=ZEMWM_CLOSE\nAlt|F5=ZEMWM_CLOSE\nCtrl|Alt|t=\"xterm -e top\"\nCtrl|q=\"Disable\"\n";
+    const QByteArray entries =
+        "Alt|F4=ZEMWM_CLOSE\nAlt|F5=ZEMWM_CLOSE\nCtrl|Alt|t=\"xterm -e top\"\nCtrl|q=\"Disable\"\n";
     const QString conflict = QStringLiteral(
         "Ouch! The %1 key combination has already been allocated\nto the %2 action (%3).\n\nPlease choose a "
         "unique key combination.");
 
-    QTest::newRow("free key") << entries << "ZEMWM_LOCK" << 0 << "Ctrl+Alt+L" << "" << QStringList{"Ctrl+Q"};
+    QTest::newRow("free key") << entries << "ZEMWM_LOCK" << 0 << "Ctrl+Alt+L"
+                              << "" << QStringList{"Ctrl+Q"};
     QTest::newRow("held by a function row")
-        << entries << "ZEMWM_LOCK" << 0 << "Alt+F4" << conflict.arg("Alt+F4", "ZEMWM_CLOSE", "close a window (recommend)")
-        << QStringList{"Ctrl+Q"};
+        << entries << "ZEMWM_LOCK" << 0 << "Alt+F4"
+        << conflict.arg("Alt+F4", "ZEMWM_CLOSE", "close a window (recommend)") << QStringList{"Ctrl+Q"};
     QTest::newRow("held by a command row")
-        << entries << "ZEMWM_LOCK" << 0 << "Ctrl+Alt+T" << conflict.arg("Ctrl+Alt+T", "command", "xterm -e top")
-        << QStringList{"Ctrl+Q"};
+        << entries << "ZEMWM_LOCK" << 0 << "Ctrl+Alt+T"
+        << conflict.arg("Ctrl+Alt+T", "command", "xterm -e top") << QStringList{"Ctrl+Q"};
     QTest::newRow("held in other letter case")
         << QByteArray("Ctrl|Alt|x=ZEMWM_KILL\n") << "ZEMWM_LOCK" << 0 << "Ctrl+Alt+X"
         << conflict.arg("Ctrl+Alt+X", "ZEMWM_KILL", "close a window forcely") << QStringList();
     QTest::newRow("the other row of the same function")
-        << entries << "ZEMWM_CLOSE" << 1 << "Alt+F4" << conflict.arg("Alt+F4", "ZEMWM_CLOSE", "close a window (recommend)")
-        << QStringList{"Ctrl+Q"};
-    QTest::newRow("disabled key taken into use again")
-        << entries << "ZEMWM_LOCK" << 0 << "Ctrl+Q" << "" << QStringList();
+        << entries << "ZEMWM_CLOSE" << 1 << "Alt+F4"
+        << conflict.arg("Alt+F4", "ZEMWM_CLOSE", "close a window (recommend)") << QStringList{"Ctrl+Q"};
+    QTest::newRow("disabled key taken into use again") << entries << "ZEMWM_LOCK" << 0 << "Ctrl+Q"
+                                                       << "" << QStringList();
 }
 
 void TestKeyAssignment::assign()
@@ -120,8 +122,8 @@ void TestKeyAssignment::assign()
         QCOMPARE(target->text(3), sourceBefore);
         QCOMPARE(f.boundRows(), othersBefore);
         // The refused combination stays on the button until another row is shown.
-        QCOMPARE(recordText(), QLatin1Char(' ') + QKeySequence(recorded).toString(QKeySequence::NativeText)
-                                   + QLatin1Char(' '));
+        QCOMPARE(recordText(), QLatin1Char(' ') + QKeySequence(recorded).toString(QKeySequence::NativeText) +
+                                   QLatin1Char(' '));
     }
     QCOMPARE(f.form()->disabledKeyList(), disabledAfter);
 }
@@ -173,7 +175,8 @@ void TestKeyAssignment::clear()
     QFETCH(QString, rowName);
     QFETCH(QStringList, disabledAfter);
 
-    QVERIFY(f.openUserFile("Alt|F5=ZEMWM_LOCK\nCtrl|q=\"Disable\"\n", "Alt|F4=ZEMWM_CLOSE\nCtrl|k=ZEMWM_KILL\n"));
+    QVERIFY(
+        f.openUserFile("Alt|F5=ZEMWM_LOCK\nCtrl|q=\"Disable\"\n", "Alt|F4=ZEMWM_CLOSE\nCtrl|k=ZEMWM_KILL\n"));
     // A system row carrying a key that the user's file already disables.
     KeysConfForm::setItemKey(f.row("ZEMWM_KILL"), QStringLiteral("Ctrl+Q"));
     f.form()->show();

@@ -153,7 +153,8 @@ void TestKeyWidget::buttonTexts_data()
     QTest::newRow("recording, nothing yet") << QStringList{"click"} << " Input ... ";
     QTest::newRow("modifiers held before a key")
         << QStringList{"click", "press Shift", "press Alt", "press Ctrl"} << " Ctrl+Alt+Shift+ ... ";
-    QTest::newRow("meta named first") << QStringList{"click", "press Ctrl", "press Meta"} << " Meta+Ctrl+ ... ";
+    QTest::newRow("meta named first")
+        << QStringList{"click", "press Ctrl", "press Meta"} << " Meta+Ctrl+ ... ";
     QTest::newRow("super held counts as meta") << QStringList{"click", "press Super_L"} << " Meta+ ... ";
     QTest::newRow("modifier held after a key")
         << QStringList{"click", "press Ctrl", "key A", "press Alt"} << " Ctrl+A,Ctrl+Alt+ ... ";
@@ -206,13 +207,15 @@ void TestKeyWidget::recordedSequence_data()
     QTest::newRow("shift kept with letter") << QStringList{"key Ctrl+Shift+A"} << "Ctrl+Shift+A";
     QTest::newRow("shift dropped with digit") << QStringList{"key Ctrl+Shift+5"} << "Ctrl+5";
     QTest::newRow("shift dropped with percent") << QStringList{"key Ctrl+Shift+%"} << "Ctrl+%";
-    QTest::newRow("backtab with shift is shift+tab") << QStringList{"key Ctrl+Shift+Backtab"} << "Ctrl+Shift+Tab";
-    QTest::newRow("super_l held gives meta") << QStringList{"press Super_L", "key A", "release Super_L"}
-                                             << "Meta+A";
-    QTest::newRow("super_r held gives meta") << QStringList{"press Super_R", "key F3", "release Super_R"}
-                                             << "Meta+F3";
+    QTest::newRow("backtab with shift is shift+tab")
+        << QStringList{"key Ctrl+Shift+Backtab"} << "Ctrl+Shift+Tab";
+    QTest::newRow("super_l held gives meta")
+        << QStringList{"press Super_L", "key A", "release Super_L"} << "Meta+A";
+    QTest::newRow("super_r held gives meta")
+        << QStringList{"press Super_R", "key F3", "release Super_R"} << "Meta+F3";
     // Only the first key is tested.
-    QTest::newRow("later keys never tested") << QStringList{"key Ctrl+A", "key B", "key Space"} << "Ctrl+A, B, Space";
+    QTest::newRow("later keys never tested")
+        << QStringList{"key Ctrl+A", "key B", "key Space"} << "Ctrl+A, B, Space";
     QTest::newRow("ignored first key then a real one") << QStringList{"key A", "key Alt+A"} << "Alt+A";
 }
 
@@ -357,10 +360,11 @@ void TestKeyWidget::emittedSignals_data()
     QTest::newRow("same sequence recorded again")
         << QStringList{"set Ctrl+T"} << QStringList{"click", "key Ctrl+T"} << QStringList();
     QTest::newRow("clear on empty") << QStringList() << QStringList{"clear"} << QStringList();
-    QTest::newRow("clear on non-empty, idle") << QStringList{"set F5"} << QStringList{"clear"} << QStringList{""};
+    QTest::newRow("clear on non-empty, idle")
+        << QStringList{"set F5"} << QStringList{"clear"} << QStringList{""};
     QTest::newRow("set while idle") << QStringList() << QStringList{"set Alt+F4"} << QStringList{"Alt+F4"};
-    QTest::newRow("set the same while idle") << QStringList{"set Alt+F4"} << QStringList{"set Alt+F4"}
-                                             << QStringList();
+    QTest::newRow("set the same while idle")
+        << QStringList{"set Alt+F4"} << QStringList{"set Alt+F4"} << QStringList();
     QTest::newRow("set during recording, compared with the sequence before it")
         << QStringList{"set Ctrl+T"} << QStringList{"click", "key Ctrl+A", "set Ctrl+T"} << QStringList();
     QTest::newRow("set another during recording")

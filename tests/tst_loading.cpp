@@ -23,8 +23,9 @@ QStringList boundRows(QTreeWidget* tree)
         const QTreeWidgetItem* row = *it;
         if (row->text(2).isEmpty() || (row->text(3).isEmpty() && KeysConfForm::itemKey(row).isEmpty()))
             continue;
-        const QString name =
-            row->text(2) == QLatin1String("ExecCommand") ? QLatin1String("cmd:") + row->text(0) : row->text(2);
+        const QString name = row->text(2) == QLatin1String("ExecCommand")
+                                 ? QLatin1String("cmd:") + row->text(0)
+                                 : row->text(2);
         rows << name + QLatin1Char('=') + KeysConfForm::itemKey(row) + QLatin1Char('@') + row->text(3);
     }
     return rows;
@@ -50,7 +51,10 @@ private slots:
 
 private:
     QString userPath() const { return QString::fromLocal8Bit(qgetenv("ZEM_USER_DIR")) + "/keyshortcutrc"; }
-    QString systemPath() const { return QString::fromLocal8Bit(qgetenv("ZEM_SYSTEM_DIR")) + "/keyshortcutrc"; }
+    QString systemPath() const
+    {
+        return QString::fromLocal8Bit(qgetenv("ZEM_SYSTEM_DIR")) + "/keyshortcutrc";
+    }
     QTemporaryDir scratch;
 };
 
@@ -81,7 +85,8 @@ void TestLoading::merge_data()
         << QByteArray("Alt|F5=ZEMWM_CLOSE\n") << QByteArray("Alt|F4=ZEMWM_CLOSE\n") << open
         << QStringList{"ZEMWM_CLOSE=Alt+F5@user", "ZEMWM_CLOSE=Alt+F4@system"} << QStringList();
     QTest::newRow("latest further row nearest the first")
-        << QByteArray("Alt|F5=ZEMWM_CLOSE\nAlt|F6=ZEMWM_CLOSE\n") << QByteArray("Alt|F4=ZEMWM_CLOSE\n") << open
+        << QByteArray("Alt|F5=ZEMWM_CLOSE\nAlt|F6=ZEMWM_CLOSE\n") << QByteArray("Alt|F4=ZEMWM_CLOSE\n")
+        << open
         << QStringList{"ZEMWM_CLOSE=Alt+F5@user", "ZEMWM_CLOSE=Alt+F4@system", "ZEMWM_CLOSE=Alt+F6@user"}
         << QStringList();
     QTest::newRow("Disable in the user's file")
@@ -95,8 +100,8 @@ void TestLoading::merge_data()
         << QStringList{"Ctrl+Q"};
     // In key order: "None1" sorts before "None|None0".
     QTest::newRow("keyless commands under placeholders")
-        << QByteArray("None|None0=\"xterm\"\nNone1=\"xclock\"\nNone|None12=\"xeyes\"\n") << QByteArray() << open
-        << QStringList{"cmd:xclock=@user", "cmd:xterm=@user", "cmd:xeyes=@user"} << QStringList();
+        << QByteArray("None|None0=\"xterm\"\nNone1=\"xclock\"\nNone|None12=\"xeyes\"\n") << QByteArray()
+        << open << QStringList{"cmd:xclock=@user", "cmd:xterm=@user", "cmd:xeyes=@user"} << QStringList();
     QTest::newRow("keyless entries do not block each other")
         << QByteArray("None|None0=ZEMWM_LOCK\n") << QByteArray("None|None0=\"xterm\"\n") << open
         << QStringList{"ZEMWM_LOCK=@user", "cmd:xterm=@system"} << QStringList();
@@ -163,7 +168,8 @@ void TestLoading::merge()
     KeysConfForm form;
     StderrCapture capture;
     QVERIFY(form.loadFile(path));
-    QCOMPARE(capture.finish(), "files " + QFile::encodeName(path) + ' ' + QFile::encodeName(mergedWith) + '\n');
+    QCOMPARE(capture.finish(),
+             "files " + QFile::encodeName(path) + ' ' + QFile::encodeName(mergedWith) + '\n');
     QCOMPARE(boundRows(form.findChild<QTreeWidget*>(QStringLiteral("keysTree"))), rows);
     QCOMPARE(form.disabledKeyList(), disabled);
     QCOMPARE(KeysConfForm::editedFile(), path);
@@ -177,14 +183,16 @@ void TestLoading::furtherRowsFollowTheFirst()
     KeysConfForm form;
     QVERIFY(form.loadFile(path));
     auto* tree = form.findChild<QTreeWidget*>(QStringLiteral("keysTree"));
-    const QList<QTreeWidgetItem*> found = tree->findItems(QStringLiteral("ZEMWM_CLOSE"), Qt::MatchExactly | Qt::MatchRecursive, 2);
+    const QList<QTreeWidgetItem*> found =
+        tree->findItems(QStringLiteral("ZEMWM_CLOSE"), Qt::MatchExactly | Qt::MatchRecursive, 2);
     QCOMPARE(found.size(), 2);
     QTreeWidgetItem* parent = found.first()->parent();
     QCOMPARE(found.last()->parent(), parent);
     QCOMPARE(parent->indexOfChild(found.last()), parent->indexOfChild(found.first()) + 1);
     QCOMPARE(found.last()->text(0), found.first()->text(0));
     // The row that was there before the extra one still follows it.
-    QCOMPARE(parent->child(parent->indexOfChild(found.last()) + 1)->text(2), QStringLiteral("ZEMWM_CLOSE_COMBINED"));
+    QCOMPARE(parent->child(parent->indexOfChild(found.last()) + 1)->text(2),
+             QStringLiteral("ZEMWM_CLOSE_COMBINED"));
 }
 
 void TestLoading::displayTextOfStoredKeys()
@@ -194,7 +202,8 @@ void TestLoading::displayTextOfStoredKeys()
     KeysConfForm form;
     QVERIFY(form.loadFile(path));
     auto* tree = form.findChild<QTreeWidget*>(QStringLiteral("keysTree"));
-    QTreeWidgetItem* close = tree->findItems(QStringLiteral("ZEMWM_CLOSE"), Qt::MatchExactly | Qt::MatchRecursive, 2).first();
+    QTreeWidgetItem* close =
+        tree->findItems(QStringLiteral("ZEMWM_CLOSE"), Qt::MatchExactly | Qt::MatchRecursive, 2).first();
     QCOMPARE(close->text(1), QKeySequence(QStringLiteral("Ctrl+Alt+T")).toString(QKeySequence::NativeText));
     QCOMPARE(KeysConfForm::itemKey(close), QStringLiteral("Ctrl+Alt+T"));
 

@@ -18,8 +18,7 @@ namespace {
 class PopupWatcher : public QObject
 {
 public:
-    explicit PopupWatcher(std::function<void(QMenu*)> onMenu)
-        : onMenu(std::move(onMenu))
+    explicit PopupWatcher(std::function<void(QMenu*)> onMenu) : onMenu(std::move(onMenu))
     {
         connect(&timer, &QTimer::timeout, this, [this] {
             if (auto* menu = qobject_cast<QMenu*>(QApplication::activePopupWidget())) {
@@ -100,12 +99,18 @@ void TestMainWindow::actionsForRow_data()
     QTest::addColumn<QString>("enabled"); // N(ew) E(dit) D(elete) C(lone), "-" for off
     QTest::addColumn<bool>("menu");
 
-    QTest::newRow("no row") << "none" << "----" << false;
-    QTest::newRow("group row") << "group" << "----" << false;
-    QTest::newRow("command group row") << "commands" << "N---" << true;
-    QTest::newRow("command row") << "command" << "NEDC" << true;
-    QTest::newRow("function with one row") << "ZEMWM_LOCK" << "---C" << true;
-    QTest::newRow("function with two rows") << "ZEMWM_CLOSE" << "--DC" << true;
+    QTest::newRow("no row") << "none"
+                            << "----" << false;
+    QTest::newRow("group row") << "group"
+                               << "----" << false;
+    QTest::newRow("command group row") << "commands"
+                                       << "N---" << true;
+    QTest::newRow("command row") << "command"
+                                 << "NEDC" << true;
+    QTest::newRow("function with one row") << "ZEMWM_LOCK"
+                                           << "---C" << true;
+    QTest::newRow("function with two rows") << "ZEMWM_CLOSE"
+                                            << "--DC" << true;
 }
 
 void TestMainWindow::actionsForRow()
@@ -126,7 +131,8 @@ void TestMainWindow::actionsForRow()
     QVERIFY(which == "none" || item);
 
     // Start from the opposite, so that every action has to be set.
-    for (const char* name : {"newCommandAction", "editCommandAction", "deleteCommandAction", "cloneCommandAction"})
+    for (const char* name :
+         {"newCommandAction", "editCommandAction", "deleteCommandAction", "cloneCommandAction"})
         form->findChild<QAction*>(QLatin1String(name))->setEnabled(true);
     if (which == "none" || which == "group")
         form->setActionsEnabled(row(QStringLiteral("ZEMWM_LOCK")));
@@ -136,9 +142,11 @@ void TestMainWindow::actionsForRow()
     if (menu)
         QCOMPARE(result, item);
     QString seen;
-    const char* names[] = {"newCommandAction", "editCommandAction", "deleteCommandAction", "cloneCommandAction"};
+    const char* names[] = {"newCommandAction", "editCommandAction", "deleteCommandAction",
+                           "cloneCommandAction"};
     for (int i = 0; i < 4; ++i)
-        seen += form->findChild<QAction*>(QLatin1String(names[i]))->isEnabled() ? QChar("NEDC"[i]) : QChar('-');
+        seen +=
+            form->findChild<QAction*>(QLatin1String(names[i]))->isEnabled() ? QChar("NEDC"[i]) : QChar('-');
     QCOMPARE(seen, enabled);
 
     // Selecting the row does the same through the tree.
@@ -163,9 +171,9 @@ void TestMainWindow::rowMenu()
 {
     QFETCH(QString, which);
     QFETCH(QStringList, enabledEntries);
-    QTreeWidgetItem* item = which == "group" ? tree->topLevelItem(0)
-        : which == "commands"               ? KeysConfForm::commandGroup()
-                                            : KeysConfForm::commandGroup()->child(0);
+    QTreeWidgetItem* item = which == "group"      ? tree->topLevelItem(0)
+                            : which == "commands" ? KeysConfForm::commandGroup()
+                                                  : KeysConfForm::commandGroup()->child(0);
     QStringList seen;
     PopupWatcher watcher([&](QMenu* menu) {
         for (QAction* action : menu->actions()) {
@@ -315,7 +323,8 @@ void TestMainWindow::initResetsState()
     QCOMPARE(KeysConfForm::startupPath(), path);
     QVERIFY(!form->findChild<QAction*>(QStringLiteral("fileSaveAction"))->isEnabled());
     QVERIFY(!form->findChild<QAction*>(QStringLiteral("fileApplyAction"))->isEnabled());
-    for (const char* name : {"newCommandAction", "editCommandAction", "deleteCommandAction", "cloneCommandAction"})
+    for (const char* name :
+         {"newCommandAction", "editCommandAction", "deleteCommandAction", "cloneCommandAction"})
         QVERIFY(!form->findChild<QAction*>(QLatin1String(name))->isEnabled());
     QVERIFY(!form->findChild<QGroupBox*>(QStringLiteral("keyGroupBox"))->isEnabled());
     QCOMPARE(form->windowTitle(), QStringLiteral("Zem hotkeys editor - window.rc"));

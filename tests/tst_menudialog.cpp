@@ -45,8 +45,12 @@ void TestMenuDialog::init()
     qputenv("XDG_DATA_DIRS", QFile::encodeName(first + ":" + second));
 
     const QByteArray app = "[Desktop Entry]\nType=Application\n";
-    writeEntry(second, "editor.desktop", app + "Name=Text Editor\nComment=Edit text\nExec=edit %F\nIcon=accessories-text-editor\nCategories=Utility;TextEditor;\n");
-    writeEntry(second, "browser.desktop", app + "Name=Web Browser\nName[de]=Netzbrowser\nExec=browse --new-window %u\nCategories=Network;WebBrowser;\n");
+    writeEntry(second, "editor.desktop",
+               app + "Name=Text Editor\nComment=Edit text\nExec=edit "
+                     "%F\nIcon=accessories-text-editor\nCategories=Utility;TextEditor;\n");
+    writeEntry(second, "browser.desktop",
+               app + "Name=Web Browser\nName[de]=Netzbrowser\nExec=browse --new-window "
+                     "%u\nCategories=Network;WebBrowser;\n");
     writeEntry(second, "hidden.desktop", app + "Name=Hidden One\nExec=hidden\nHidden=true\n");
     writeEntry(second, "nodisplay.desktop", app + "Name=No Display\nExec=nodisplay\nNoDisplay=true\n");
     writeEntry(second, "link.desktop", "[Desktop Entry]\nType=Link\nName=A Link\nURL=https://example.org\n");
@@ -54,12 +58,15 @@ void TestMenuDialog::init()
     writeEntry(home, "dup.desktop", app + "Name=Home Duplicate\nExec=dup-home\n");
     writeEntry(first, "gone.desktop", app + "Name=Gone\nExec=gone\nHidden=true\n");
     writeEntry(second, "gone.desktop", app + "Name=Should Stay Gone\nExec=gone\n");
-    writeEntry(second, "vendor/tool.desktop", app + "Name=Vendor Tool\nExec=vendor-tool\nCategories=Development;\n");
+    writeEntry(second, "vendor/tool.desktop",
+               app + "Name=Vendor Tool\nExec=vendor-tool\nCategories=Development;\n");
     writeEntry(second, "noexec.desktop", app + "Name=No Exec\n");
     writeEntry(second, "broken.desktop", "this is not a desktop entry at all\n\x01\x02");
     writeEntry(second, "binary.desktop", app + "Name=Bin" + QByteArray(1, '\0') + "ary\nExec=binary\n");
-    writeEntry(second, "huge.desktop", app + "Name=Huge\nExec=huge\nComment=" + QByteArray(400 * 1024, 'x') + "\n");
-    writeEntry(second, "percent.desktop", app + "Name=Percent\nExec=sh -c \"echo 100%%\" %i %c %k\nCategories=System;\n");
+    writeEntry(second, "huge.desktop",
+               app + "Name=Huge\nExec=huge\nComment=" + QByteArray(400 * 1024, 'x') + "\n");
+    writeEntry(second, "percent.desktop",
+               app + "Name=Percent\nExec=sh -c \"echo 100%%\" %i %c %k\nCategories=System;\n");
 }
 
 void TestMenuDialog::cleanup()
@@ -137,11 +144,13 @@ void TestMenuDialog::chosenCommandLine()
 {
     ZemMenuDialog dialog;
     auto* tree = dialog.findChild<QTreeWidget*>("applicationTree");
-    const QList<QTreeWidgetItem*> found = tree->findItems("Web Browser", Qt::MatchExactly | Qt::MatchRecursive);
+    const QList<QTreeWidgetItem*> found =
+        tree->findItems("Web Browser", Qt::MatchExactly | Qt::MatchRecursive);
     QCOMPARE(found.size(), 1);
     tree->setCurrentItem(found.first());
     QVERIFY(dialog.findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok)->isEnabled());
-    QCOMPARE(dialog.selectedItemExec(QString(), QString(), nullptr, nullptr), QStringLiteral("browse --new-window"));
+    QCOMPARE(dialog.selectedItemExec(QString(), QString(), nullptr, nullptr),
+             QStringLiteral("browse --new-window"));
     tree->setCurrentItem(tree->topLevelItem(0)); // a group is no choice
     QVERIFY(dialog.selectedItemExec(QString(), QString(), nullptr, nullptr).isEmpty());
 }
@@ -151,13 +160,20 @@ void TestMenuDialog::execFieldCodes_data()
     QTest::addColumn<QString>("exec");
     QTest::addColumn<QString>("command");
 
-    QTest::newRow("trailing %U") << "firefox %U" << "firefox";
-    QTest::newRow("code between arguments") << "app %f --x" << "app --x";
-    QTest::newRow("every code") << "a %f %F %u %U %i %c %k %d %D %n %N %v %m b" << "a b";
-    QTest::newRow("codes side by side") << "a %d%D b" << "a b";
-    QTest::newRow("percent sign") << "sh -c \"echo 100%%\"" << "sh -c \"echo 100%\"";
-    QTest::newRow("inner spacing kept") << "sh -c \"a  b\" %f" << "sh -c \"a  b\"";
-    QTest::newRow("lone percent at the end") << "calc 5%" << "calc 5%";
+    QTest::newRow("trailing %U") << "firefox %U"
+                                 << "firefox";
+    QTest::newRow("code between arguments") << "app %f --x"
+                                            << "app --x";
+    QTest::newRow("every code") << "a %f %F %u %U %i %c %k %d %D %n %N %v %m b"
+                                << "a b";
+    QTest::newRow("codes side by side") << "a %d%D b"
+                                        << "a b";
+    QTest::newRow("percent sign") << "sh -c \"echo 100%%\""
+                                  << "sh -c \"echo 100%\"";
+    QTest::newRow("inner spacing kept") << "sh -c \"a  b\" %f"
+                                        << "sh -c \"a  b\"";
+    QTest::newRow("lone percent at the end") << "calc 5%"
+                                             << "calc 5%";
 }
 
 void TestMenuDialog::execFieldCodes()

@@ -17,7 +17,6 @@
 
 #include <X11/Xlib.h>
 
-
 namespace {
 
 // Sets or unsets environment variables for one test and puts them back afterwards.
@@ -107,7 +106,7 @@ void TestPlatform::userDirectory()
     environment.set("HOME", QFile::encodeName(base + QLatin1String("/home")));
 
     QString want = expected.startsWith(QLatin1Char('~')) ? base + QLatin1String("/home") + expected.mid(1)
-                                                          : base + QLatin1Char('/') + expected;
+                                                         : base + QLatin1Char('/') + expected;
     QCOMPARE(dirOf(ZEM_USER_CONFIG_DIR), want);
 }
 
@@ -168,8 +167,8 @@ void TestPlatform::initNamesTheSettingsStore()
     QVERIFY(!QIcon::fromTheme(QStringLiteral("document-save")).isNull());
 
     QSettings settings;
-    QCOMPARE(settings.fileName(),
-             QString::fromLocal8Bit(qgetenv("XDG_CONFIG_HOME")) + QLatin1String("/zem/zem-admin-hotkeys.conf"));
+    QCOMPARE(settings.fileName(), QString::fromLocal8Bit(qgetenv("XDG_CONFIG_HOME")) +
+                                      QLatin1String("/zem/zem-admin-hotkeys.conf"));
 }
 
 void TestPlatform::commandReachesRootWindow()

@@ -44,32 +44,33 @@ void TestSaving::cleanup()
 void TestSaving::writtenBytes_data()
 {
     QTest::addColumn<bool>("userFile");
-    QTest::addColumn<QByteArray>("entries");  // of the opened file
-    QTest::addColumn<QByteArray>("system");   // of the system file
-    QTest::addColumn<QString>("edit");        // what is done before saving
-    QTest::addColumn<QByteArray>("written");  // after "[ShortCutKeys]\n"
+    QTest::addColumn<QByteArray>("entries"); // of the opened file
+    QTest::addColumn<QByteArray>("system");  // of the system file
+    QTest::addColumn<QString>("edit");       // what is done before saving
+    QTest::addColumn<QByteArray>("written"); // after "[ShortCutKeys]\n"
 
     QTest::newRow("user's file: user rows and disabled keys only")
         << true << QByteArray("Alt|F5=ZEMWM_LOCK\nCtrl|Alt|t=\"xterm\"\n")
         << QByteArray("Alt|F4=ZEMWM_CLOSE\nCtrl|k=ZEMWM_KILL\nCtrl|Alt|c=\"xclock\"\n") << "clear ZEMWM_CLOSE"
         << QByteArray("Alt|F5=ZEMWM_LOCK\nCtrl|Alt|t=\"xterm\"\nAlt|F4=\"Disable\"\n");
     QTest::newRow("user's file: a system row given a new key becomes the user's")
-        << true << QByteArray() << QByteArray("Alt|F4=ZEMWM_CLOSE\nCtrl|k=ZEMWM_KILL\n") << "key ZEMWM_KILL Ctrl+Alt+K"
-        << QByteArray("Ctrl|Alt|k=ZEMWM_KILL\n");
+        << true << QByteArray() << QByteArray("Alt|F4=ZEMWM_CLOSE\nCtrl|k=ZEMWM_KILL\n")
+        << "key ZEMWM_KILL Ctrl+Alt+K" << QByteArray("Ctrl|Alt|k=ZEMWM_KILL\n");
     QTest::newRow("other file: every bound row")
-        << false << QByteArray("Alt|F4=ZEMWM_CLOSE\nAlt|F5=ZEMWM_CLOSE\nCtrl|Alt|t=\"xterm\"\n") << QByteArray()
-        << "" << QByteArray("Alt|F4=ZEMWM_CLOSE\nAlt|F5=ZEMWM_CLOSE\nCtrl|Alt|t=\"xterm\"\n");
+        << false << QByteArray("Alt|F4=ZEMWM_CLOSE\nAlt|F5=ZEMWM_CLOSE\nCtrl|Alt|t=\"xterm\"\n")
+        << QByteArray() << "" << QByteArray("Alt|F4=ZEMWM_CLOSE\nAlt|F5=ZEMWM_CLOSE\nCtrl|Alt|t=\"xterm\"\n");
     QTest::newRow("keyless commands under placeholders")
         << false << QByteArray("None|None7=\"xterm\"\nNone|None9=\"xclock\"\n") << QByteArray() << ""
         << QByteArray("None|None0=\"xterm\"\nNone|None1=\"xclock\"\n");
     QTest::newRow("multi-key sequence written with its first key")
-        << false << QByteArray() << QByteArray() << "key ZEMWM_LOCK Ctrl+A, B" << QByteArray("Ctrl|a=ZEMWM_LOCK\n");
+        << false << QByteArray() << QByteArray() << "key ZEMWM_LOCK Ctrl+A, B"
+        << QByteArray("Ctrl|a=ZEMWM_LOCK\n");
     QTest::newRow("disabled key replaces a set key in place")
         << false << QByteArray("Alt|F4=ZEMWM_CLOSE\nAlt|F5=ZEMWM_LOCK\nCtrl|q=\"Disable\"\n") << QByteArray()
         << "key ZEMWM_CLOSE Ctrl+Q" << QByteArray("Ctrl|q=\"Disable\"\nAlt|F5=ZEMWM_LOCK\n");
     QTest::newRow("same key twice in other case: the later row replaces the earlier line")
-        << false << QByteArray("Alt|F4=ZEMWM_CLOSE\nAlt|F5=ZEMWM_LOCK\n") << QByteArray() << "key ZEMWM_LOCK alt+f4"
-        << QByteArray("Alt|F4=ZEMWM_LOCK\n");
+        << false << QByteArray("Alt|F4=ZEMWM_CLOSE\nAlt|F5=ZEMWM_LOCK\n") << QByteArray()
+        << "key ZEMWM_LOCK alt+f4" << QByteArray("Alt|F4=ZEMWM_LOCK\n");
     QTest::newRow("key the key server cannot name")
         << false << QByteArray("Ctrl|NoSuchKey=ZEMWM_CLOSE\n") << QByteArray() << ""
         << QByteArray("Ctrl|NoSuchKey=ZEMWM_CLOSE\n");
@@ -77,13 +78,15 @@ void TestSaving::writtenBytes_data()
         << false << QByteArray("Ctrl|t=\"\"quoted\" arg\"\n") << QByteArray() << ""
         << QByteArray("Ctrl|t=\"\"quoted\" arg\"\n");
     QTest::newRow("command line Disable reads back as a disabled key")
-        << false << QByteArray() << QByteArray() << "command Disable" << QByteArray("None|None0=\"Disable\"\n");
-    QTest::newRow("non-ascii command")
-        << false << QByteArray("Ctrl|e=\"echo Grüße ключ\"\n") << QByteArray() << ""
-        << QByteArray("Ctrl|e=\"echo Grüße ключ\"\n");
+        << false << QByteArray() << QByteArray() << "command Disable"
+        << QByteArray("None|None0=\"Disable\"\n");
+    QTest::newRow("non-ascii command") << false << QByteArray("Ctrl|e=\"echo Grüße ключ\"\n") << QByteArray()
+                                       << "" << QByteArray("Ctrl|e=\"echo Grüße ключ\"\n");
     QTest::newRow("keypad, space and calculator")
-        << false << QByteArray("None|KP_1=ZEMWM_CLOSE\nCtrl|space=ZEMWM_LOCK\nNone|XF86Calculator=\"xcalc\"\n")
-        << QByteArray() << "" << QByteArray("None|KP_1=ZEMWM_CLOSE\nCtrl|space=ZEMWM_LOCK\nNone|XF86Calculator=\"xcalc\"\n");
+        << false
+        << QByteArray("None|KP_1=ZEMWM_CLOSE\nCtrl|space=ZEMWM_LOCK\nNone|XF86Calculator=\"xcalc\"\n")
+        << QByteArray() << ""
+        << QByteArray("None|KP_1=ZEMWM_CLOSE\nCtrl|space=ZEMWM_LOCK\nNone|XF86Calculator=\"xcalc\"\n");
 }
 
 void TestSaving::writtenBytes()
@@ -164,14 +167,18 @@ void TestSaving::roundTrip()
 {
     QFETCH(quint32, seed);
     QRandomGenerator random(seed);
-    const QStringList functions{"ZEMWM_CLOSE", "ZEMWM_KILL", "ZEMWM_LOCK", "ZEMWM_TOGGLE_PAGER", "ZEMWM_MOVE",
-                                "ZEMWM_TOGGLE_BORDER", "ZEMWM_NEXT_WALLPAPER", "ZEMWM_NO_SUCH_FUNCTION"};
-    const QStringList modifiers{"None|", "Ctrl|", "Alt|", "Shift|", "Super|", "Ctrl|Alt|", "Ctrl|Shift|Super|"};
-    const QStringList keys{"a", "z", "5", "F1", "F12", "Escape", "space", "Print", "KP_3", "XF86AudioMute",
-                           "comma", "Left", "Delete", "Tab"};
+    const QStringList functions{
+        "ZEMWM_CLOSE", "ZEMWM_KILL",          "ZEMWM_LOCK",           "ZEMWM_TOGGLE_PAGER",
+        "ZEMWM_MOVE",  "ZEMWM_TOGGLE_BORDER", "ZEMWM_NEXT_WALLPAPER", "ZEMWM_NO_SUCH_FUNCTION"};
+    const QStringList modifiers{
+        "None|", "Ctrl|", "Alt|", "Shift|", "Super|", "Ctrl|Alt|", "Ctrl|Shift|Super|"};
+    const QStringList keys{"a",      "z",     "5",      "F1",   "F12",
+                           "Escape", "space", "Print",  "KP_3", "XF86AudioMute",
+                           "comma",  "Left",  "Delete", "Tab"};
     QByteArray entries;
     for (int i = 0; i < 40; ++i) {
-        const QString key = modifiers.at(random.bounded(modifiers.size())) + keys.at(random.bounded(keys.size()));
+        const QString key =
+            modifiers.at(random.bounded(modifiers.size())) + keys.at(random.bounded(keys.size()));
         QString value;
         switch (random.bounded(4)) {
         case 0:
@@ -261,7 +268,8 @@ void TestSaving::immutableFile()
     QVERIFY(capture.finish().startsWith("zem-admin-hotkeys: Can't save file "));
     QCOMPARE(readFile(path), old);
     // No half-written temporary file is left beside it.
-    QCOMPARE(QDir(scratch.path()).entryList({"immutable*"}, QDir::Files | QDir::Hidden), QStringList{"immutable.rc"});
+    QCOMPARE(QDir(scratch.path()).entryList({"immutable*"}, QDir::Files | QDir::Hidden),
+             QStringList{"immutable.rc"});
 }
 
 void TestSaving::permissionsAndLinksSurvive()
@@ -269,7 +277,8 @@ void TestSaving::permissionsAndLinksSurvive()
     const QString target = otherPath(QStringLiteral("target.rc"));
     const QString link = otherPath(QStringLiteral("link.rc"));
     QVERIFY(writeFile(target, "[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\n"));
-    QVERIFY(QFile::setPermissions(target, QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ReadGroup));
+    QVERIFY(QFile::setPermissions(target,
+                                  QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ReadGroup));
     QVERIFY(QFile::link(target, link));
 
     QVERIFY(f.openFile(link, "Alt|F4=ZEMWM_CLOSE\n"));

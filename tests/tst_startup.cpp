@@ -35,7 +35,13 @@ public:
         return process.state() == QProcess::NotRunning || process.waitForFinished(timeoutMs);
     }
     bool running() { return !process.waitForFinished(0) && process.state() == QProcess::Running; }
-    QString describe() { return QStringLiteral("state %1, exit %2, said: %3").arg(process.state()).arg(exitCode()).arg(QString::fromLocal8Bit(process.readAllStandardError())); }
+    QString describe()
+    {
+        return QStringLiteral("state %1, exit %2, said: %3")
+            .arg(process.state())
+            .arg(exitCode())
+            .arg(QString::fromLocal8Bit(process.readAllStandardError()));
+    }
     int exitCode() const { return process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1; }
     QByteArray standardOutput() { return process.readAllStandardOutput(); }
     QByteArray standardError() { return process.readAllStandardError(); }
@@ -115,7 +121,8 @@ QProcessEnvironment TestStartup::environmentFor(const QByteArray& display) const
 void TestStartup::expectMainWindowThenClose(Editor& editor, const QString& fileName)
 {
     const unsigned long window = x->waitForWindow(QRegularExpression::escape(mainWindowTitle.arg(fileName)));
-    QVERIFY2(window, qPrintable(QStringLiteral("no main window; the editor said: ") + editor.standardError()));
+    QVERIFY2(window,
+             qPrintable(QStringLiteral("no main window; the editor said: ") + editor.standardError()));
     x->requestClose(window);
     QVERIFY(editor.finished());
     QCOMPARE(editor.exitCode(), 0);
@@ -159,8 +166,8 @@ void TestStartup::userFileChosen()
     QCOMPARE(readFile(userFile()), QByteArray("[ShortCutKeys]\n"));
     QVERIFY(!QFileInfo::exists(QStringLiteral("/tmp/a-file")));
     const QByteArray said = editor.standardError();
-    QVERIFY2(said.contains("files " + QFile::encodeName(userFile()) + ' '
-                           + QFile::encodeName(caseDir + QLatin1String("/system/keyshortcutrc")) + '\n'),
+    QVERIFY2(said.contains("files " + QFile::encodeName(userFile()) + ' ' +
+                           QFile::encodeName(caseDir + QLatin1String("/system/keyshortcutrc")) + '\n'),
              said.constData());
 }
 
@@ -223,16 +230,17 @@ void TestStartup::uncreatableFile()
 
 void TestStartup::unloadableFile_data()
 {
-    QTest::addColumn<QString>("argument");    // relative to the case directory; empty: none
-    QTest::addColumn<QByteArray>("content");  // of that file, or of the user's file
-    QTest::addColumn<QByteArray>("system");   // the system file; null: missing
+    QTest::addColumn<QString>("argument");   // relative to the case directory; empty: none
+    QTest::addColumn<QByteArray>("content"); // of that file, or of the user's file
+    QTest::addColumn<QByteArray>("system");  // the system file; null: missing
 
     QTest::newRow("named file without section") << "bad.rc" << QByteArray("[Other]\na=b\n") << systemFile;
     QTest::newRow("named empty file") << "empty.rc" << QByteArray("") << systemFile;
     QTest::newRow("named directory") << "system" << QByteArray() << systemFile;
     QTest::newRow("user's file without section") << "" << QByteArray("Alt|x=ZEMWM_CLOSE\n") << systemFile;
     QTest::newRow("system file missing") << "" << QByteArray("[ShortCutKeys]\n") << QByteArray();
-    QTest::newRow("system file without section") << "" << QByteArray("[ShortCutKeys]\n") << QByteArray("x=y\n");
+    QTest::newRow("system file without section")
+        << "" << QByteArray("[ShortCutKeys]\n") << QByteArray("x=y\n");
 }
 
 void TestStartup::unloadableFile()
@@ -250,7 +258,8 @@ void TestStartup::unloadableFile()
     if (!QFileInfo(path).isDir())
         QVERIFY(writeFile(path, content));
 
-    Editor editor(environmentFor(server->displayName()), argument.isEmpty() ? QStringList() : QStringList{path});
+    Editor editor(environmentFor(server->displayName()),
+                  argument.isEmpty() ? QStringList() : QStringList{path});
     const unsigned long box = x->waitForWindow(QStringLiteral("Attention"));
     QVERIFY2(box, "no message about the file that cannot be read");
     QVERIFY(x->pressKey(box, QStringLiteral("Return")));
@@ -319,7 +328,8 @@ void TestStartup::otherDisplayRunsItsOwn()
     Editor here(environmentFor(server->displayName()), {});
     QVERIFY(x->waitForWindow(QStringLiteral("Zem hotkeys editor - keyshortcutrc")));
     Editor there(environmentFor(other.displayName()), {});
-    const unsigned long window = otherScreen.waitForWindow(QStringLiteral("Zem hotkeys editor - keyshortcutrc"));
+    const unsigned long window =
+        otherScreen.waitForWindow(QStringLiteral("Zem hotkeys editor - keyshortcutrc"));
     QVERIFY2(window, "the editor on the other display did not start its own window");
     QVERIFY2(here.running(), qPrintable(here.describe()));
     otherScreen.requestClose(window);

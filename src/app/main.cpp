@@ -56,9 +56,10 @@ int main(int argc, char** argv)
     QStringList arguments;
     for (int i = 1; i < argc; ++i)
         arguments << QString::fromLocal8Bit(argv[i]);
-    if (!arguments.isEmpty()
-        && (arguments.first() == QLatin1String("--help") || arguments.first() == QLatin1String("-h"))) {
-        const QString usage = QObject::tr("Usage: zem-admin-hotkeys filepath - open/create file as hotkeys coll\n");
+    if (!arguments.isEmpty() &&
+        (arguments.first() == QLatin1String("--help") || arguments.first() == QLatin1String("-h"))) {
+        const QString usage =
+            QObject::tr("Usage: zem-admin-hotkeys filepath - open/create file as hotkeys coll\n");
         std::fputs(usage.toLocal8Bit().constData(), stdout);
         std::fputs("\n", stdout);
         std::fflush(stdout);
@@ -90,16 +91,16 @@ int main(int argc, char** argv)
         path = userHotkeysFilePath();
 
     if (!QFile::exists(path) && !createHotkeysFile(path)) {
-        QMessageBox::warning(nullptr, QObject::tr("Attention"), QObject::tr("Can't open/create file:\n%1").arg(path),
-                             QMessageBox::Ok);
+        QMessageBox::warning(nullptr, QObject::tr("Attention"),
+                             QObject::tr("Can't open/create file:\n%1").arg(path), QMessageBox::Ok);
         delete form;
         delete app;
         return CreationFailed;
     }
 
     if (!form->init(path)) {
-        QMessageBox::warning(nullptr, QObject::tr("Attention"), QObject::tr("Can't parse file:\n%1").arg(path),
-                             QMessageBox::Ok);
+        QMessageBox::warning(nullptr, QObject::tr("Attention"),
+                             QObject::tr("Can't parse file:\n%1").arg(path), QMessageBox::Ok);
         delete form;
         delete app;
         return LoadFailed;

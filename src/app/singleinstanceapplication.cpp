@@ -22,17 +22,17 @@ constexpr quint32 longestMessage = 1 << 20;
 QString serverNameFor(const QString& id)
 {
     // The id may hold anything DISPLAY holds ("/" included); a digest makes it a safe name.
-    const QByteArray digest = QCryptographicHash::hash(id.toUtf8(), QCryptographicHash::Sha1).toHex().left(16);
-    return QStringLiteral("zem-admin-hotkeys-%1-%2").arg(QString::number(::getuid()), QString::fromLatin1(digest));
+    const QByteArray digest =
+        QCryptographicHash::hash(id.toUtf8(), QCryptographicHash::Sha1).toHex().left(16);
+    return QStringLiteral("zem-admin-hotkeys-%1-%2")
+        .arg(QString::number(::getuid()), QString::fromLatin1(digest));
 }
 
 } // namespace
 
 SingleInstanceApplication::SingleInstanceApplication(const QString& id, int& argc, char** argv)
-    : QApplication(argc, argv)
-    , appId(id)
-    , serverName(serverNameFor(id))
-    , lock(std::make_unique<QLockFile>(QDir::temp().filePath(serverName + QLatin1String(".lock"))))
+    : QApplication(argc, argv), appId(id), serverName(serverNameFor(id)),
+      lock(std::make_unique<QLockFile>(QDir::temp().filePath(serverName + QLatin1String(".lock"))))
 {
     // Stale only when its owner is gone, never by age: an editor may stay open for weeks.
     lock->setStaleLockTime(0);

@@ -5,7 +5,8 @@
 
 // One line of the window manager's function catalogue: a group title (no key name, code 0) or
 // a function with the name the hotkeys file knows it by.
-struct WmFunctionEntry {
+struct WmFunctionEntry
+{
     const char* keyName = nullptr; // null for a group entry
     QString text;                  // translated description or group title
     qint32 code = 0;               // 0 for a group entry, else unique and positive

@@ -26,8 +26,7 @@ const QString fileDialogSizeKey = QStringLiteral("SelectCommandDialog/fileDialog
 
 } // namespace
 
-SelectCommandDialog::SelectCommandDialog(QWidget* parent)
-    : QDialog(parent)
+SelectCommandDialog::SelectCommandDialog(QWidget* parent) : QDialog(parent)
 {
     if (objectName().isEmpty())
         setObjectName(QStringLiteral("commandDialog"));
@@ -145,18 +144,17 @@ void SelectCommandDialog::selectCommandFile()
 
         const QFileInfo file(chosen);
         if (!file.exists()) {
-            if (QMessageBox::warning(this, tr("File doesn't exist"),
-                                     tr("File you have selected doesn't exist. Do you want to choose another one?"),
-                                     QMessageBox::Yes | QMessageBox::Cancel)
-                == QMessageBox::Cancel)
+            if (QMessageBox::warning(
+                    this, tr("File doesn't exist"),
+                    tr("File you have selected doesn't exist. Do you want to choose another one?"),
+                    QMessageBox::Yes | QMessageBox::Cancel) == QMessageBox::Cancel)
                 return;
             continue;
         }
         if (!file.isFile() || !file.isExecutable()) {
             if (QMessageBox::warning(this, tr("File isn't executable"),
                                      tr("You can't exec selected file. Do you want to choose another one?"),
-                                     QMessageBox::Yes | QMessageBox::Cancel)
-                == QMessageBox::Cancel)
+                                     QMessageBox::Yes | QMessageBox::Cancel) == QMessageBox::Cancel)
                 return;
             continue;
         }

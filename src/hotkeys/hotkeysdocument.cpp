@@ -7,15 +7,15 @@
 
 #include <string>
 
-struct HotkeysDocument::Private {
+struct HotkeysDocument::Private
+{
     // UTF-8 storage on, multiple keys off, multi-line values off.
     ZemIni ini{true, false, false};
 
     Private() { ini.SetSpaces(false); }
 };
 
-HotkeysDocument::HotkeysDocument()
-    : d(std::make_unique<Private>())
+HotkeysDocument::HotkeysDocument() : d(std::make_unique<Private>())
 {
     clear();
 }
@@ -64,8 +64,7 @@ QVector<HotkeysEntry> HotkeysDocument::entries() const
 bool HotkeysDocument::setValue(const QString& key, const QString& value)
 {
     return d->ini.SetValue(hotkeysSection, key.toLocal8Bit().constData(), value.toLocal8Bit().constData(),
-                           nullptr, false)
-        >= 0;
+                           nullptr, false) >= 0;
 }
 
 QByteArray HotkeysDocument::toBytes() const

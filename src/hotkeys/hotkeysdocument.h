@@ -6,7 +6,8 @@
 
 #include <memory>
 
-struct HotkeysEntry {
+struct HotkeysEntry
+{
     QString key;   // as written in the file, decoded
     QString value; // as written, decoded; empty when the line has none
 };

@@ -9,8 +9,8 @@ namespace {
 
 QString hotkeysFileIn(ZemDir dir)
 {
-    return QString::fromStdString(GetZemDir(dir)) + QLatin1String("/keyshortcutrc")
-        + QString::fromStdString(zemSessionConfigSuffix(ZEM_CURRENT_SESSION));
+    return QString::fromStdString(GetZemDir(dir)) + QLatin1String("/keyshortcutrc") +
+           QString::fromStdString(zemSessionConfigSuffix(ZEM_CURRENT_SESSION));
 }
 
 } // namespace

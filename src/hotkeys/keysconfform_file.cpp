@@ -50,8 +50,9 @@ bool KeysConfForm::selectFile(bool forOpen)
 {
     const QString startDir = QString::fromStdString(GetZemDir(ZEM_USER_CONFIG_DIR));
     const QString caption = tr("Select hotkeys file");
-    const QString chosen = forOpen ? QFileDialog::getOpenFileName(this, caption, startDir, QStringLiteral("*"))
-                                   : QFileDialog::getSaveFileName(this, caption, startDir, QStringLiteral("*"));
+    const QString chosen = forOpen
+                               ? QFileDialog::getOpenFileName(this, caption, startDir, QStringLiteral("*"))
+                               : QFileDialog::getSaveFileName(this, caption, startDir, QStringLiteral("*"));
     if (chosen.isEmpty())
         return false;
     currentFile = chosen;
@@ -75,9 +76,11 @@ bool KeysConfForm::copyToCurrentFile(const QString& from)
     // Started with an argument list, never through a shell: any path is only a path.
     QProcess copy;
     copy.start(QStringLiteral("/bin/cp"), {QStringLiteral("-f"), QStringLiteral("--"), from, currentFile});
-    const bool copied = copy.waitForFinished(-1) && copy.exitStatus() == QProcess::NormalExit && copy.exitCode() == 0;
+    const bool copied =
+        copy.waitForFinished(-1) && copy.exitStatus() == QProcess::NormalExit && copy.exitCode() == 0;
     if (!copied)
-        QMessageBox::warning(this, tr("Error"), tr("Can't copy %1\nto %2").arg(from, currentFile), QMessageBox::Ok);
+        QMessageBox::warning(this, tr("Error"), tr("Can't copy %1\nto %2").arg(from, currentFile),
+                             QMessageBox::Ok);
     return copied;
 }
 
@@ -141,10 +144,8 @@ void KeysConfForm::fileSaveAs()
 
 void KeysConfForm::fileRestore()
 {
-    if (modified
-        && QMessageBox::question(this, tr("Save ?"), tr("All changes will be lost. Save them?"),
-                                 QMessageBox::Yes | QMessageBox::No)
-            == QMessageBox::Yes)
+    if (modified && QMessageBox::question(this, tr("Save ?"), tr("All changes will be lost. Save them?"),
+                                          QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes)
         fileSaveAs();
 
     const QString previous = currentFile;

@@ -38,7 +38,8 @@ bool KeysConfForm::loadFile(const QString& path)
     if (!systemPath.isEmpty() && !systemDocument.load(systemPath))
         return false;
 
-    std::fprintf(stderr, "files %s %s\n", path.toLocal8Bit().constData(), systemPath.toLocal8Bit().constData());
+    std::fprintf(stderr, "files %s %s\n", path.toLocal8Bit().constData(),
+                 systemPath.toLocal8Bit().constData());
 
     currentFile = path;
     updateTitle();

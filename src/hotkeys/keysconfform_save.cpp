@@ -70,8 +70,8 @@ bool KeysConfForm::saveFile()
         }
         // Quoting every command line keeps one that begins or ends with a quote intact.
         const QString action = row->text(2).contains(QLatin1String("ZEMWM_"))
-            ? row->text(2)
-            : QLatin1Char('"') + row->text(0) + QLatin1Char('"');
+                                   ? row->text(2)
+                                   : QLatin1Char('"') + row->text(0) + QLatin1Char('"');
         setOrComplain(document, fileKeyOf(itemKey(row)), action);
     }
     for (const QString& key : qAsConst(disabledKeys))
@@ -79,8 +79,10 @@ bool KeysConfForm::saveFile()
 
     const QByteArray bytes = document.toBytes();
     QSaveFile file(currentFile);
-    if (bytes.isEmpty() || !file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size() || !file.commit()) {
-        std::fprintf(stderr, "zem-admin-hotkeys: Can't save file %s\n", currentFile.toLocal8Bit().constData());
+    if (bytes.isEmpty() || !file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size() ||
+        !file.commit()) {
+        std::fprintf(stderr, "zem-admin-hotkeys: Can't save file %s\n",
+                     currentFile.toLocal8Bit().constData());
         return false;
     }
     return true;

@@ -9,7 +9,8 @@ namespace {
 
 constexpr quint32 fiveModifiers =
     Qt::ShiftModifier | Qt::ControlModifier | Qt::AltModifier | Qt::MetaModifier | Qt::KeypadModifier;
-constexpr quint32 fourModifiers = Qt::ShiftModifier | Qt::ControlModifier | Qt::AltModifier | Qt::MetaModifier;
+constexpr quint32 fourModifiers =
+    Qt::ShiftModifier | Qt::ControlModifier | Qt::AltModifier | Qt::MetaModifier;
 // Qt reports a key it cannot name with this code.
 constexpr int unsupportedKeyCode = -1;
 
@@ -36,8 +37,7 @@ bool isSuperKey(int key)
 } // namespace
 
 KKeySequenceButton::KKeySequenceButton(KKeySequenceWidgetPrivate* d, QWidget* parent)
-    : QPushButton(parent)
-    , d(d)
+    : QPushButton(parent), d(d)
 {
 }
 
@@ -110,8 +110,8 @@ void KKeySequenceButton::keyPressEvent(QKeyEvent* event)
     }
 
     // A first key without Control, Alt, Meta or the keypad must be one that makes sense alone.
-    if (d->keyCount == 0 && (held & ~quint32(Qt::ShiftModifier)) == 0
-        && !KKeySequenceWidgetPrivate::keyAllowedAlone(key) && !d->bareFirstKeyAllowed)
+    if (d->keyCount == 0 && (held & ~quint32(Qt::ShiftModifier)) == 0 &&
+        !KKeySequenceWidgetPrivate::keyAllowedAlone(key) && !d->bareFirstKeyAllowed)
         return;
     if (key == 0)
         return;

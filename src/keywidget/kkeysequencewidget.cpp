@@ -9,11 +9,7 @@
 #include <QMessageBox>
 #include <QToolButton>
 
-
-KKeySequenceWidgetPrivate::KKeySequenceWidgetPrivate(KKeySequenceWidget* q)
-    : owner(q)
-{
-}
+KKeySequenceWidgetPrivate::KKeySequenceWidgetPrivate(KKeySequenceWidget* q) : owner(q) {}
 
 void KKeySequenceWidgetPrivate::setup()
 {
@@ -32,7 +28,8 @@ void KKeySequenceWidgetPrivate::setup()
     layout->addWidget(clearSequenceButton);
 
     QObject::connect(recordButton, &QPushButton::clicked, owner, &KKeySequenceWidget::captureKeySequence);
-    QObject::connect(clearSequenceButton, &QToolButton::clicked, owner, &KKeySequenceWidget::clearKeySequence);
+    QObject::connect(clearSequenceButton, &QToolButton::clicked, owner,
+                     &KKeySequenceWidget::clearKeySequence);
     QObject::connect(&releaseTimer, &QTimer::timeout, owner, &KKeySequenceWidget::doneRecording);
     releaseTimer.setSingleShot(true);
 
@@ -128,8 +125,7 @@ QKeySequence KKeySequenceWidgetPrivate::appendKey(const QKeySequence& seq, int k
 }
 
 KKeySequenceWidget::KKeySequenceWidget(QWidget* parent)
-    : QWidget(parent)
-    , d(new KKeySequenceWidgetPrivate(this))
+    : QWidget(parent), d(new KKeySequenceWidgetPrivate(this))
 {
     d->setup();
 }

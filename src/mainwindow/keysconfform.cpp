@@ -40,8 +40,7 @@ QAction* makeAction(QObject* parent, const QString& text, const char* iconName)
 
 } // namespace
 
-KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
-    : QMainWindow(parent, flags)
+KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags) : QMainWindow(parent, flags)
 {
     setWindowTitle(tr("Zem hotkeys editor"));
     userSource = tr("user");
@@ -58,7 +57,8 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     keysTree->setSizePolicy(QSizePolicy::MinimumExpanding, QSizePolicy::MinimumExpanding);
     keysTree->setAllColumnsShowFocus(true);
     keysTree->header()->setContextMenuPolicy(Qt::CustomContextMenu);
-    connect(keysTree->header(), &QHeaderView::customContextMenuRequested, this, &KeysConfForm::showHeaderMenu);
+    connect(keysTree->header(), &QHeaderView::customContextMenuRequested, this,
+            &KeysConfForm::showHeaderMenu);
     mainLayout->addWidget(keysTree);
 
     keyGroupBox = new QGroupBox(tr("Choose a Key for the Selected Action"), central);
@@ -96,11 +96,16 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     deleteCommandAction = makeAction(this, tr("&Delete"), "edit-delete");
     deleteCommandAction->setShortcut(Qt::Key_Delete);
     const std::pair<QAction*, const char*> names[] = {
-        {fileNewAction, "fileNewAction"},           {fileOpenAction, "fileOpenAction"},
-        {fileRestoreAction, "fileRestoreAction"},   {fileSaveAction, "fileSaveAction"},
-        {fileSaveAsAction, "fileSaveAsAction"},     {fileExitAction, "fileExitAction"},
-        {fileApplyAction, "fileApplyAction"},       {newCommandAction, "newCommandAction"},
-        {cloneCommandAction, "cloneCommandAction"}, {editCommandAction, "editCommandAction"},
+        {fileNewAction, "fileNewAction"},
+        {fileOpenAction, "fileOpenAction"},
+        {fileRestoreAction, "fileRestoreAction"},
+        {fileSaveAction, "fileSaveAction"},
+        {fileSaveAsAction, "fileSaveAsAction"},
+        {fileExitAction, "fileExitAction"},
+        {fileApplyAction, "fileApplyAction"},
+        {newCommandAction, "newCommandAction"},
+        {cloneCommandAction, "cloneCommandAction"},
+        {editCommandAction, "editCommandAction"},
         {deleteCommandAction, "deleteCommandAction"},
     };
     for (const auto& [action, name] : names)
@@ -241,7 +246,8 @@ void KeysConfForm::setItemKey(QTreeWidgetItem* row, const QString& key)
     if (!row)
         return;
     row->setData(1, Qt::UserRole, key);
-    const QString shown = QKeySequence::fromString(key, QKeySequence::NativeText).toString(QKeySequence::NativeText);
+    const QString shown =
+        QKeySequence::fromString(key, QKeySequence::NativeText).toString(QKeySequence::NativeText);
     row->setText(1, shown.isEmpty() ? key : shown);
 }
 
@@ -326,9 +332,7 @@ bool KeysConfForm::messageReceived(const QString&)
     return true;
 }
 
-void KeysConfForm::grabKeys()
-{
-}
+void KeysConfForm::grabKeys() {}
 
 QTreeWidgetItem* KeysConfForm::targetRow() const
 {

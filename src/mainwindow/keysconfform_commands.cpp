@@ -38,13 +38,14 @@ void KeysConfForm::editCommand()
 
 void KeysConfForm::itemDoubleClicked(QTreeWidgetItem* clicked, int)
 {
-    if (!commandGroupItem || commandGroupItem->childCount() == 0 || !clicked
-        || clicked->parent() != commandGroupItem)
+    if (!commandGroupItem || commandGroupItem->childCount() == 0 || !clicked ||
+        clicked->parent() != commandGroupItem)
         return;
 
     SelectCommandDialog dialog(this);
     dialog.setCommand(clicked->text(0));
-    if (dialog.exec() != QDialog::Accepted || dialog.command().isEmpty() || dialog.command() == clicked->text(0))
+    if (dialog.exec() != QDialog::Accepted || dialog.command().isEmpty() ||
+        dialog.command() == clicked->text(0))
         return;
     clicked->setText(0, dialog.command());
     clicked->setText(2, execCommand);
@@ -77,13 +78,13 @@ void KeysConfForm::deleteCommand()
     if (!parent)
         return;
     if (QMessageBox::question(this, tr("Delete"), tr("Are you sure to delete this action?"),
-                              QMessageBox::Yes | QMessageBox::No, QMessageBox::No)
-        != QMessageBox::Yes)
+                              QMessageBox::Yes | QMessageBox::No, QMessageBox::No) != QMessageBox::Yes)
         return;
 
     // A system binding stays switched off once the user's file is saved. A row without a key
     // binds nothing, and an empty disabled key would be written as a bogus entry.
-    if (target->text(3) == systemSource && !itemKey(target).isEmpty() && !disabledKeys.contains(itemKey(target)))
+    if (target->text(3) == systemSource && !itemKey(target).isEmpty() &&
+        !disabledKeys.contains(itemKey(target)))
         disabledKeys.append(itemKey(target));
     delete target;
     keysTree->setCurrentItem(parent);

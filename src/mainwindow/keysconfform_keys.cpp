@@ -32,7 +32,8 @@ void KeysConfForm::itemSelected(QTreeWidgetItem* selected)
         // Keys that loading could not turn into a key sequence are shown as they were read.
         const QKeySequence sequence = QKeySequence::fromString(key, QKeySequence::NativeText);
         const QString portable = sequence.toString(QKeySequence::PortableText);
-        const bool danglingPlus = portable.endsWith(QLatin1Char('+')) && !portable.endsWith(QLatin1String("++"));
+        const bool danglingPlus =
+            portable.endsWith(QLatin1Char('+')) && !portable.endsWith(QLatin1String("++"));
         // Qt parses a name it does not know as Key_unknown instead of failing, so a sequence
         // holding one counts as empty too.
         bool unknownKey = false;

@@ -18,8 +18,8 @@ QString FormFixture::systemPath()
 
 bool FormFixture::openUserFile(const QByteArray& userEntries, const QByteArray& systemEntries)
 {
-    return writeFile(systemPath(), "[ShortCutKeys]\n" + systemEntries)
-        && writeFile(userPath(), "[ShortCutKeys]\n" + userEntries) && open(userPath());
+    return writeFile(systemPath(), "[ShortCutKeys]\n" + systemEntries) &&
+           writeFile(userPath(), "[ShortCutKeys]\n" + userEntries) && open(userPath());
 }
 
 bool FormFixture::openFile(const QString& path, const QByteArray& entries)
@@ -48,8 +48,9 @@ QTreeWidgetItem* FormFixture::row(const QString& name, int index) const
 {
     const bool command = name.startsWith(QLatin1String("cmd:"));
     for (QTreeWidgetItemIterator it(tree()); *it; ++it) {
-        const bool match = command ? (*it)->parent() == KeysConfForm::commandGroup() && (*it)->text(0) == name.mid(4)
-                                   : (*it)->text(2) == name;
+        const bool match =
+            command ? (*it)->parent() == KeysConfForm::commandGroup() && (*it)->text(0) == name.mid(4)
+                    : (*it)->text(2) == name;
         if (match && index-- == 0)
             return *it;
     }
@@ -68,8 +69,9 @@ QStringList FormFixture::boundRows() const
         const QTreeWidgetItem* item = *it;
         if (item->text(2).isEmpty() || (item->text(3).isEmpty() && KeysConfForm::itemKey(item).isEmpty()))
             continue;
-        const QString name = item->text(2) == QLatin1String("ExecCommand") ? QLatin1String("cmd:") + item->text(0)
-                                                                          : item->text(2);
+        const QString name = item->text(2) == QLatin1String("ExecCommand")
+                                 ? QLatin1String("cmd:") + item->text(0)
+                                 : item->text(2);
         rows << name + QLatin1Char('=') + KeysConfForm::itemKey(item) + QLatin1Char('@') + item->text(3);
     }
     return rows;

@@ -7,8 +7,7 @@
 #include <QPushButton>
 
 ModalAnswerer::ModalAnswerer(QList<QMessageBox::StandardButton> answers, QStringList files)
-    : answers(std::move(answers))
-    , files(std::move(files))
+    : answers(std::move(answers)), files(std::move(files))
 {
     // Polled from the nested event loop of the box itself.
     connect(&timer, &QTimer::timeout, this, &ModalAnswerer::poll);
@@ -69,9 +68,9 @@ void ModalAnswerer::poll()
     record.buttons = box->standardButtons();
     if (QAbstractButton* preset = box->defaultButton())
         record.defaultButton = box->standardButton(preset);
-    const QMessageBox::StandardButton answer = answers.isEmpty() ? QMessageBox::Ok
-        : seen.size() < answers.size()                          ? answers.at(seen.size())
-                                                                 : answers.last();
+    const QMessageBox::StandardButton answer = answers.isEmpty()              ? QMessageBox::Ok
+                                               : seen.size() < answers.size() ? answers.at(seen.size())
+                                                                              : answers.last();
     seen.append(record);
 
     if (QAbstractButton* button = box->button(answer))

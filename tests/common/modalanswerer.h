@@ -17,7 +17,8 @@ class ModalAnswerer : public QObject
     Q_OBJECT
 
 public:
-    struct Box {
+    struct Box
+    {
         QString title;
         QString text;
         QWidget* parent = nullptr;
@@ -25,7 +26,8 @@ public:
         QMessageBox::StandardButton defaultButton = QMessageBox::NoButton;
     };
 
-    struct FileDialog {
+    struct FileDialog
+    {
         QString caption;
         QString directory;
         bool forSaving = false;

@@ -4,8 +4,7 @@
 #include <QFile>
 #include <QFileInfo>
 
-TestEnvironment::TestEnvironment()
-    : dir(QDir::tempPath() + QLatin1String("/zem-test-XXXXXX"))
+TestEnvironment::TestEnvironment() : dir(QDir::tempPath() + QLatin1String("/zem-test-XXXXXX"))
 {
     QDir().mkpath(configHome());
     QDir().mkpath(userDir());

@@ -9,8 +9,7 @@
 #include <X11/Xlib.h>
 #include <X11/Xutil.h>
 
-XConnection::XConnection(const QByteArray& name)
-    : displayName(name.isEmpty() ? qgetenv("DISPLAY") : name)
+XConnection::XConnection(const QByteArray& name) : displayName(name.isEmpty() ? qgetenv("DISPLAY") : name)
 {
     display = XOpenDisplay(displayName.constData());
 }
@@ -30,9 +29,9 @@ QString XConnection::title(unsigned long window) const
     unsigned long count = 0, after = 0;
     unsigned char* data = nullptr;
     QString result;
-    if (XGetWindowProperty(display, window, netWmName, 0, 1024, False, utf8, &type, &format, &count, &after, &data)
-            == Success
-        && data) {
+    if (XGetWindowProperty(display, window, netWmName, 0, 1024, False, utf8, &type, &format, &count, &after,
+                           &data) == Success &&
+        data) {
         result = QString::fromUtf8(reinterpret_cast<const char*>(data), int(count));
         XFree(data);
         return result;
@@ -129,9 +128,8 @@ QByteArray XConnection::rootProperty(const char* name) const
     unsigned char* data = nullptr;
     QByteArray result;
     if (XGetWindowProperty(display, DefaultRootWindow(display), property, 0, 1 << 20, False, AnyPropertyType,
-                           &type, &format, &count, &after, &data)
-            == Success
-        && data) {
+                           &type, &format, &count, &after, &data) == Success &&
+        data) {
         if (type == XA_STRING && format == 8)
             result = QByteArray(reinterpret_cast<const char*>(data), int(count));
         XFree(data);
@@ -145,8 +143,7 @@ void XConnection::deleteRootProperty(const char* name) const
     XSync(display, False);
 }
 
-PrivateXServer::PrivateXServer()
-    : server(std::make_unique<QProcess>())
+PrivateXServer::PrivateXServer() : server(std::make_unique<QProcess>())
 {
     // Xvfb writes the display number it found free to standard output once it is ready.
     server->setProgram(QStringLiteral("Xvfb"));
