@@ -10,8 +10,9 @@
 
 class QDialog;
 
-// Answers the modal message boxes that code under test opens, so that no test ever waits on
-// one. Each box met is recorded (title, text, parent) and answered with the button asked for.
+// Answers the modal message boxes and dialogs that code under test opens, so that no test ever
+// waits on one. Each box met is recorded (title, text, parent) and answered with the button
+// asked for. When several answerers live at once, the one made last answers.
 class ModalAnswerer : public QObject
 {
     Q_OBJECT
@@ -51,6 +52,7 @@ public:
     int otherDialogCount() const { return othersSeen; }
 
 private:
+    static QList<ModalAnswerer*>& live();
     void poll();
 
     QList<QMessageBox::StandardButton> answers;
