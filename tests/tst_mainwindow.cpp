@@ -214,6 +214,14 @@ void TestMainWindow::headerMenuTogglesFunctionColumn()
 void TestMainWindow::firstRunDefaults()
 {
     QCOMPARE(form->size(), QSize(800, 600));
+    // The columns fit the rows inside the collapsed groups too.
+    const QFontMetrics metrics(tree->font());
+    QVERIFY(tree->columnWidth(0) >
+            metrics.horizontalAdvance(QStringLiteral("horizontally tile windows within the screen")));
+    QVERIFY(
+        tree->columnWidth(1) >
+        metrics.horizontalAdvance(QKeySequence(QStringLiteral("Alt+F4")).toString(QKeySequence::NativeText)));
+    QVERIFY(!tree->topLevelItem(0)->isExpanded());
     QVERIFY(tree->isColumnHidden(2));
     QVERIFY(!tree->isColumnHidden(0) && !tree->isColumnHidden(1) && !tree->isColumnHidden(3));
     QVERIFY(!form->isMaximized());

@@ -217,10 +217,14 @@ void KeysConfForm::restoreWindowState()
     if (!headerState.isEmpty()) {
         keysTree->header()->restoreState(headerState);
     } else {
+        // Qt measures only the rows it shows; the groups start collapsed, and the columns are to
+        // fit the loaded rows inside them as well.
+        keysTree->expandAll();
         keysTree->resizeColumnToContents(0);
         keysTree->resizeColumnToContents(1);
         keysTree->hideColumn(2);
         keysTree->resizeColumnToContents(3);
+        keysTree->collapseAll();
     }
 }
 
