@@ -282,7 +282,11 @@ void TestFileKeys::unreadablePaths()
     HotkeysDocument document;
     QVERIFY(!document.load(QString()));
     QVERIFY(!document.load(scratch.filePath(QStringLiteral("no-such-file"))));
-    QVERIFY(!document.load(scratch.path())); // a directory
+    QVERIFY(!document.load(scratch.path()));              // a directory
+    QVERIFY(!document.load(QStringLiteral("/dev/zero"))); // would never end
+    const QString pipe = scratch.filePath(QStringLiteral("pipe"));
+    QCOMPARE(QProcess::execute(QStringLiteral("mkfifo"), {pipe}), 0);
+    QVERIFY(!document.load(pipe)); // would wait for a writer
     QVERIFY(document.entries().isEmpty());
 }
 

@@ -4,6 +4,7 @@
 #include "zemini.h"
 
 #include <QFile>
+#include <QFileInfo>
 
 #include <string>
 
@@ -27,8 +28,10 @@ bool HotkeysDocument::load(const QString& path)
     d = std::make_unique<Private>();
     if (path.isEmpty())
         return false;
-    // Read through QFile rather than SimpleIni's fopen so that a directory or a special file
-    // is refused instead of being parsed as garbage.
+    // Only regular files: a directory would be parsed as garbage, a device such as /dev/zero
+    // would never end, and opening a named pipe would wait for a writer.
+    if (!QFileInfo(path).isFile())
+        return false;
     QFile file(path);
     if (!file.open(QIODevice::ReadOnly))
         return false;

@@ -93,6 +93,7 @@ bool KeysConfForm::isKeyPresent(const QKeySequence& seq, bool warnuser)
     if (warnuser) {
         // The holder is named by its function, or as a command for command rows.
         const QString function = holder->text(2);
+        //: Names a command entry in "to the %2 action (%3)", where %3 is its command line.
         const QString holderName = function == QLatin1String("ExecCommand") ? tr("command") : function;
         QMessageBox::warning(this, tr("Whoopsie! Key conflict."),
                              tr("Ouch! The %1 key combination has already been allocated\nto the %2 action "
