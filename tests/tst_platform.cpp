@@ -1,6 +1,7 @@
 // The project's stand-in for the desktop platform libraries: directories, initialisation, the
 // window-manager command channel and the Help menu.
 #include "hotkeysfile.h"
+#include "startup.h"
 #include "stderrcapture.h"
 #include "testenvironment.h"
 #include "xwindows.h"
@@ -11,6 +12,7 @@
 #include <QAction>
 #include <QDir>
 #include <QIcon>
+#include <QImage>
 #include <QSettings>
 #include <QX11Info>
 #include <QtTest>
@@ -72,6 +74,9 @@ private slots:
     void commandReachesRootWindow();
     void commandWithoutDisplay();
     void helpMenu();
+    void windowIconFallback_data();
+    void windowIconFallback();
+    void instanceIdFollowsTheDisplay();
 
 private:
     QTemporaryDir scratch;
@@ -209,6 +214,65 @@ void TestPlatform::helpMenu()
     for (QAction* action : menu->actions())
         texts << action->text();
     QCOMPARE(texts, (QStringList{"About Zem hotkeys editor", "About Qt"}));
+}
+
+void TestPlatform::windowIconFallback_data()
+{
+    QTest::addColumn<QStringList>("themeIcons");
+    QTest::addColumn<QString>("chosen"); // empty: no icon at all
+
+    QTest::newRow("hotkeys icon") << QStringList{"preferences-desktop-keyboard-khotkeys",
+                                                 "preferences-desktop-keyboard"}
+                                  << "preferences-desktop-keyboard-khotkeys";
+    QTest::newRow("keyboard icon as fallback")
+        << QStringList{"preferences-desktop-keyboard"} << "preferences-desktop-keyboard";
+    QTest::newRow("neither") << QStringList() << "";
+}
+
+void TestPlatform::windowIconFallback()
+{
+    QFETCH(QStringList, themeIcons);
+    QFETCH(QString, chosen);
+
+    // A theme of the test's own, holding just the icons of this row; Qt keeps the themes it
+    // has read, so every row has a theme of another name.
+    static int rowNumber = 0;
+    const QString themeName = QStringLiteral("testtheme%1").arg(++rowNumber);
+    const QString base = scratch.filePath(QStringLiteral("icons"));
+    QVERIFY(writeFile(base + "/" + themeName + "/index.theme",
+                      "[Icon Theme]\nName=test\nDirectories=apps\n\n[apps]\nSize=48\nType=Fixed\n"));
+    QVERIFY(QDir().mkpath(base + "/" + themeName + "/apps"));
+    for (const QString& name : themeIcons) {
+        QImage image(48, 48, QImage::Format_ARGB32);
+        image.fill(Qt::blue);
+        QVERIFY(image.save(base + "/" + themeName + "/apps/" + name + ".png"));
+    }
+    const QStringList searchPaths = QIcon::themeSearchPaths();
+    const QString theme = QIcon::themeName();
+    const QString fallback = QIcon::fallbackThemeName();
+    QIcon::setThemeSearchPaths({base});
+    QIcon::setThemeName(themeName);
+    QIcon::setFallbackThemeName(themeName);
+    // A themed icon is looked up when it is first used, so it is looked at before the real
+    // theme comes back.
+    const QIcon icon = editorWindowIcon();
+    const bool isNull = icon.isNull();
+    const QString name = icon.name();
+    QIcon::setThemeSearchPaths(searchPaths);
+    QIcon::setThemeName(theme);
+    QIcon::setFallbackThemeName(fallback);
+
+    QCOMPARE(isNull, chosen.isEmpty());
+    QCOMPARE(name, chosen);
+}
+
+void TestPlatform::instanceIdFollowsTheDisplay()
+{
+    EnvironmentOverride environment;
+    environment.set("DISPLAY", QByteArray(":7.0"));
+    QCOMPARE(singleInstanceId(), QStringLiteral(":7.0zem-admin-hotkeys"));
+    environment.set("DISPLAY", QByteArray());
+    QCOMPARE(singleInstanceId(), QStringLiteral("zem-admin-hotkeys"));
 }
 
 ZEM_TEST_MAIN(TestPlatform)

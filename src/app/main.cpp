@@ -1,10 +1,10 @@
 #include "hotkeysfile.h"
 #include "keysconfform.h"
 #include "myapplication.h"
+#include "startup.h"
 #include "zemcore.h"
 
 #include <QFile>
-#include <QIcon>
 #include <QMessageBox>
 
 #include <cstdio>
@@ -18,17 +18,6 @@ enum ExitStatus {
     CreationFailed = 3,
     LoadFailed = 4,
 };
-
-QString singleInstanceId()
-{
-    return QString::fromLocal8Bit(qgetenv("DISPLAY")) + QLatin1String("zem-admin-hotkeys");
-}
-
-QIcon windowIcon()
-{
-    const QIcon icon = QIcon::fromTheme(QStringLiteral("preferences-desktop-keyboard-khotkeys"));
-    return icon.isNull() ? QIcon::fromTheme(QStringLiteral("preferences-desktop-keyboard")) : icon;
-}
 
 bool createHotkeysFile(const QString& path)
 {
@@ -68,7 +57,7 @@ int main(int argc, char** argv)
     }
 
     auto* form = new KeysConfForm();
-    form->setWindowIcon(windowIcon());
+    form->setWindowIcon(editorWindowIcon());
 
     QString path;
     if (arguments.size() == 1) {
