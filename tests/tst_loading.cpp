@@ -1,5 +1,6 @@
 // Loading hotkeys files into the binding tree: the user's file merged with the system one, any
 // other file alone, and files that cannot be loaded.
+#include "formfixture.h"
 #include "keysconfform.h"
 #include "stderrcapture.h"
 #include "testenvironment.h"
@@ -13,23 +14,6 @@
 namespace {
 
 enum class Opened { AsUserFile, AsOtherFile, ByDoubledSlash, BySymbolicLink };
-
-// The rows that hold a binding, in tree order: "FUNCTION=key@source" for function rows and
-// "cmd:command line=key@source" for command rows.
-QStringList boundRows(QTreeWidget* tree)
-{
-    QStringList rows;
-    for (QTreeWidgetItemIterator it(tree); *it; ++it) {
-        const QTreeWidgetItem* row = *it;
-        if (row->text(2).isEmpty() || (row->text(3).isEmpty() && KeysConfForm::itemKey(row).isEmpty()))
-            continue;
-        const QString name = row->text(2) == QLatin1String("ExecCommand")
-                                 ? QLatin1String("cmd:") + row->text(0)
-                                 : row->text(2);
-        rows << name + QLatin1Char('=') + KeysConfForm::itemKey(row) + QLatin1Char('@') + row->text(3);
-    }
-    return rows;
-}
 
 } // namespace
 

@@ -62,10 +62,10 @@ void FormFixture::select(QTreeWidgetItem* item) const
     tree()->setCurrentItem(item);
 }
 
-QStringList FormFixture::boundRows() const
+QStringList boundRows(QTreeWidget* tree)
 {
     QStringList rows;
-    for (QTreeWidgetItemIterator it(tree()); *it; ++it) {
+    for (QTreeWidgetItemIterator it(tree); *it; ++it) {
         const QTreeWidgetItem* item = *it;
         if (item->text(2).isEmpty() || (item->text(3).isEmpty() && KeysConfForm::itemKey(item).isEmpty()))
             continue;

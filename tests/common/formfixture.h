@@ -11,6 +11,9 @@ class QAction;
 class QTreeWidget;
 class QTreeWidgetItem;
 
+// Bound rows in tree order: "FUNCTION=key@source", "cmd:command line=key@source".
+QStringList boundRows(QTreeWidget* tree);
+
 // A main window over hotkeys files written by the test, as start-up would make it.
 class FormFixture
 {
@@ -31,8 +34,7 @@ public:
     QTreeWidgetItem* row(const QString& name, int index = 0) const;
     // Makes the row current and selected, as a click does.
     void select(QTreeWidgetItem* row) const;
-    // Bound rows in tree order: "FUNCTION=key@source", "cmd:command line=key@source".
-    QStringList boundRows() const;
+    QStringList boundRows() const { return ::boundRows(tree()); }
     void reset() { window.reset(); }
 
 private:
