@@ -1,4 +1,5 @@
 // The window manager's function catalogue and the tree it rebuilds at every load.
+#include "formfixture.h"
 #include "keysconfform.h"
 #include "testenvironment.h"
 #include "wmfunctioncatalogue.h"
@@ -110,12 +111,9 @@ void TestCatalogue::descriptions()
 
 void TestCatalogue::treeRows()
 {
-    const QString path = scratch.filePath(QStringLiteral("empty.rc"));
-    QVERIFY(writeFile(path, "[ShortCutKeys]\n"));
-    KeysConfForm form;
-    QVERIFY(form.loadFile(path));
-    auto* tree = form.findChild<QTreeWidget*>(QStringLiteral("keysTree"));
-    QVERIFY(tree);
+    FormFixture f;
+    QVERIFY(f.openFile(scratch.filePath(QStringLiteral("empty.rc")), QByteArray()));
+    QTreeWidget* tree = f.tree();
 
     const QVector<WmFunctionEntry> table = buildWmFunctionTable();
     QCOMPARE(tree->topLevelItemCount(), 13);

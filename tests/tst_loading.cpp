@@ -162,32 +162,27 @@ void TestLoading::merge()
 
 void TestLoading::furtherRowsFollowTheFirst()
 {
-    const QString path = scratch.filePath(QStringLiteral("rows.rc"));
-    QVERIFY(writeFile(path, "[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\nAlt|F5=ZEMWM_CLOSE\nAlt|F6=ZEMWM_LOWER\n"));
-    KeysConfForm form;
-    QVERIFY(form.loadFile(path));
-    auto* tree = form.findChild<QTreeWidget*>(QStringLiteral("keysTree"));
-    const QList<QTreeWidgetItem*> found =
-        tree->findItems(QStringLiteral("ZEMWM_CLOSE"), Qt::MatchExactly | Qt::MatchRecursive, 2);
-    QCOMPARE(found.size(), 2);
-    QTreeWidgetItem* parent = found.first()->parent();
-    QCOMPARE(found.last()->parent(), parent);
-    QCOMPARE(parent->indexOfChild(found.last()), parent->indexOfChild(found.first()) + 1);
-    QCOMPARE(found.last()->text(0), found.first()->text(0));
+    FormFixture f;
+    QVERIFY(f.openFile(scratch.filePath(QStringLiteral("rows.rc")),
+                       "Alt|F4=ZEMWM_CLOSE\nAlt|F5=ZEMWM_CLOSE\nAlt|F6=ZEMWM_LOWER\n"));
+    QTreeWidgetItem* first = f.row("ZEMWM_CLOSE");
+    QTreeWidgetItem* further = f.row("ZEMWM_CLOSE", 1);
+    QVERIFY(first && further && !f.row("ZEMWM_CLOSE", 2));
+    QTreeWidgetItem* parent = first->parent();
+    QCOMPARE(further->parent(), parent);
+    QCOMPARE(parent->indexOfChild(further), parent->indexOfChild(first) + 1);
+    QCOMPARE(further->text(0), first->text(0));
     // The row that was there before the extra one still follows it.
-    QCOMPARE(parent->child(parent->indexOfChild(found.last()) + 1)->text(2),
+    QCOMPARE(parent->child(parent->indexOfChild(further) + 1)->text(2),
              QStringLiteral("ZEMWM_CLOSE_COMBINED"));
 }
 
 void TestLoading::displayTextOfStoredKeys()
 {
-    const QString path = scratch.filePath(QStringLiteral("display.rc"));
-    QVERIFY(writeFile(path, "[ShortCutKeys]\nCtrl|Alt|t=ZEMWM_CLOSE\nhash=ZEMWM_KILL\n"));
-    KeysConfForm form;
-    QVERIFY(form.loadFile(path));
-    auto* tree = form.findChild<QTreeWidget*>(QStringLiteral("keysTree"));
-    QTreeWidgetItem* close =
-        tree->findItems(QStringLiteral("ZEMWM_CLOSE"), Qt::MatchExactly | Qt::MatchRecursive, 2).first();
+    FormFixture f;
+    QVERIFY(f.openFile(scratch.filePath(QStringLiteral("display.rc")),
+                       "Ctrl|Alt|t=ZEMWM_CLOSE\nhash=ZEMWM_KILL\n"));
+    QTreeWidgetItem* close = f.row("ZEMWM_CLOSE");
     QCOMPARE(close->text(1), QKeySequence(QStringLiteral("Ctrl+Alt+T")).toString(QKeySequence::NativeText));
     QCOMPARE(KeysConfForm::itemKey(close), QStringLiteral("Ctrl+Alt+T"));
 
