@@ -1,6 +1,6 @@
 #include "zemcore.h"
 
-#include <QApplication>
+#include <QGuiApplication>
 #include <QByteArray>
 #include <QDir>
 #include <QFileInfo>

@@ -160,7 +160,7 @@ void TestFileCommands::failedSaveInQuestionStops()
         ModalAnswerer answerer({QMessageBox::Yes, QMessageBox::Ok}, {scratch.filePath("never.rc")});
         f.form()->fileNew();
         QCOMPARE(answerer.titles(), (QStringList{"Save ?", "Error"}));
-        QCOMPARE(answerer.boxes().at(1).text, QStringLiteral("Can't save in file ") + path);
+        QCOMPARE(answerer.boxes().at(1).text, QStringLiteral("Can't save in file ") + path + QStringLiteral("\nIs a directory"));
         QCOMPARE(answerer.fileDialogs().size(), 0); // New stopped
         QVERIFY(KeysConfForm::isModified());
         QCOMPARE(KeysConfForm::itemKey(f.row("ZEMWM_LOCK")), QStringLiteral("Ctrl+Alt+L"));
@@ -181,7 +181,7 @@ void TestFileCommands::failedSaveKeepsEdits()
     ModalAnswerer answerer;
     f.form()->fileSave();
     QCOMPARE(answerer.titles(), QStringList{"Error"});
-    QCOMPARE(answerer.last().text, QStringLiteral("Can't save in file ") + path);
+    QCOMPARE(answerer.last().text, QStringLiteral("Can't save in file ") + path + QStringLiteral("\nIs a directory"));
     QVERIFY(KeysConfForm::isModified());
     QVERIFY(savedActionsEnabled());
 }
@@ -245,7 +245,7 @@ void TestFileCommands::openUnreadableFileChangesNothing()
     ModalAnswerer answerer({QMessageBox::No, QMessageBox::Ok}, {bad});
     f.form()->fileOpen();
     QCOMPARE(answerer.titles(), (QStringList{"Save ?", "Attention"}));
-    QCOMPARE(answerer.last().text, QStringLiteral("Can't parse file:\n") + bad);
+    QCOMPARE(answerer.last().text, QStringLiteral("Can't parse file:\n") + bad + QStringLiteral("\nNo [ShortCutKeys] section"));
     QCOMPARE(KeysConfForm::editedFile(), path);
     QCOMPARE(f.form()->windowTitle(), QStringLiteral("Zem hotkeys editor - ") + QFileInfo(path).fileName());
     QVERIFY(KeysConfForm::isModified());
@@ -307,7 +307,7 @@ void TestFileCommands::saveDialogCannotCreate()
     ModalAnswerer answerer({}, {impossible});
     f.form()->fileNew();
     QCOMPARE(answerer.titles(), QStringList{"Error"});
-    QCOMPARE(answerer.last().text, QStringLiteral("Can't create file ") + impossible);
+    QCOMPARE(answerer.last().text, QStringLiteral("Can't create file ") + impossible + QStringLiteral("\nNo such file or directory"));
     QVERIFY(!KeysConfForm::isModified()); // New stopped before its end
 }
 
@@ -398,7 +398,7 @@ void TestFileCommands::applyWithFailedSave()
     ModalAnswerer answerer;
     f.form()->fileApply();
     QCOMPARE(answerer.titles(), QStringList{"Error"});
-    QCOMPARE(answerer.last().text, QStringLiteral("Can't save in file ") + path);
+    QCOMPARE(answerer.last().text, QStringLiteral("Can't save in file ") + path + QStringLiteral("\nIs a directory"));
     QVERIFY(KeysConfForm::isModified());
     QVERIFY(savedActionsEnabled());
     // Give a wrongly sent command every chance to arrive before looking.

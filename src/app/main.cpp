@@ -19,15 +19,6 @@ enum ExitStatus {
     LoadFailed = 4,
 };
 
-bool createHotkeysFile(const QString& path)
-{
-    QFile file(path);
-    if (!file.open(QIODevice::WriteOnly | QIODevice::Text))
-        return false;
-    const bool written = file.write(emptyHotkeysFile) == qint64(sizeof(emptyHotkeysFile) - 1);
-    return file.flush() && written;
-}
-
 } // namespace
 
 int main(int argc, char** argv)
@@ -79,9 +70,12 @@ int main(int argc, char** argv)
     if (path.isEmpty())
         path = userHotkeysFilePath();
 
-    if (!QFile::exists(path) && !createHotkeysFile(path)) {
+    // Created all or nothing: a full disk must not leave an empty file that no later start can read.
+    QString reason;
+    if (!QFile::exists(path) && !writeFileSafely(path, emptyHotkeysFile, &reason)) {
         QMessageBox::warning(nullptr, QObject::tr("Attention"),
-                             QObject::tr("Can't open/create file:\n%1").arg(path), QMessageBox::Ok);
+                             QObject::tr("Can't open/create file:\n%1").arg(path) + QLatin1Char('\n') + reason,
+                             QMessageBox::Ok);
         delete form;
         delete app;
         return CreationFailed;
@@ -89,7 +83,7 @@ int main(int argc, char** argv)
 
     if (!form->init(path)) {
         QMessageBox::warning(nullptr, QObject::tr("Attention"),
-                             QObject::tr("Can't parse file:\n%1").arg(path), QMessageBox::Ok);
+                             QObject::tr("Can't parse file:\n%1").arg(form->loadFailure()), QMessageBox::Ok);
         delete form;
         delete app;
         return LoadFailed;

@@ -1,21 +1,22 @@
 #pragma once
 
 #include <QByteArray>
-#include <QString>
 #include <QVector>
 
 #include <memory>
 
+// An entry of the [ShortCutKeys] section as the INI reader gives it: key and value bytes,
+// trimmed, the value of the last line of that key.
 struct HotkeysEntry
 {
-    QString key;   // as written in the file, decoded
-    QString value; // as written, decoded; empty when the line has none
+    QByteArray key;
+    QByteArray value;
 };
 
-// One hotkeys file as an INI document, always set up the same way: UTF-8 storage (a leading
-// byte-order mark is skipped), one value per key, no multi-line values, no spaces around "=",
-// keys compared without regard to ASCII case. Text crosses into and out of it in the local
-// 8-bit encoding. Only the [ShortCutKeys] section is read or written.
+// What the entries of a hotkeys file mean, as the window manager's INI reader reads them:
+// UTF-8 storage (a leading byte-order mark is skipped), one value per key, no multi-line
+// values, keys compared without regard to ASCII case, a later line of a key overriding an
+// earlier one. Only the [ShortCutKeys] section is looked at.
 class HotkeysDocument
 {
 public:
@@ -23,17 +24,10 @@ public:
     ~HotkeysDocument();
     Q_DISABLE_COPY(HotkeysDocument)
 
-    // Reads the file; false when it cannot be read or lacks the [ShortCutKeys] section.
-    bool load(const QString& path);
-    // Starts over with a document holding only an empty [ShortCutKeys] section.
-    void clear();
-
-    // The entries of the section, ordered by key with ASCII case ignored.
+    // False when the bytes hold no [ShortCutKeys] section.
+    bool load(const QByteArray& bytes);
+    // The entries, ordered by key with ASCII case ignored.
     QVector<HotkeysEntry> entries() const;
-    // Sets an entry; an existing key (in any case) keeps its place and takes the new value.
-    bool setValue(const QString& key, const QString& value);
-    // The document as the window manager reads it, without a byte-order mark.
-    QByteArray toBytes() const;
 
 private:
     struct Private;

@@ -3,7 +3,18 @@
 #include "zemcore.h"
 #include "zemkeyserver.h"
 
+#include <QCoreApplication>
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QKeySequence>
 #include <QRegularExpression>
+
+#include <cerrno>
+#include <cstring>
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
 
 namespace {
 
@@ -11,6 +22,51 @@ QString hotkeysFileIn(ZemDir dir)
 {
     return QString::fromStdString(GetZemDir(dir)) + QLatin1String("/keyshortcutrc") +
            QString::fromStdString(zemSessionConfigSuffix(ZEM_CURRENT_SESSION));
+}
+
+QString systemReason(int error)
+{
+    return QString::fromLocal8Bit(std::strerror(error));
+}
+
+QString tr(const char* text)
+{
+    return QCoreApplication::translate("HotkeysFile", text);
+}
+
+// The file a path finally names, following symbolic links, so that saving through a link
+// replaces the file behind it and the link stays.
+QString finalTarget(const QString& path)
+{
+    QString target = path;
+    for (int hops = 0; hops < 40; ++hops) {
+        const QFileInfo info(target);
+        if (!info.isSymLink())
+            break;
+        target = info.symLinkTarget();
+    }
+    return target;
+}
+
+bool writeAll(int fd, const QByteArray& bytes)
+{
+    const char* data = bytes.constData();
+    qint64 left = bytes.size();
+    while (left > 0) {
+        const ssize_t written = ::write(fd, data, size_t(left));
+        if (written < 0) {
+            if (errno == EINTR)
+                continue;
+            return false;
+        }
+        if (written == 0) {
+            errno = ENOSPC;
+            return false;
+        }
+        data += written;
+        left -= written;
+    }
+    return true;
 }
 
 } // namespace
@@ -45,9 +101,7 @@ QString fromFileKey(const QString& fileKey)
 {
     static const QRegularExpression placeholder(QStringLiteral("None[0-9]+"));
 
-    QString key = fileKey;
-    if (key.startsWith(QLatin1Char('"')))
-        key = key.mid(1, key.size() - 2);
+    QString key = unquoted(fileKey);
     key.replace(QLatin1Char('|'), QLatin1Char('+'));
     key.remove(QStringLiteral("None+"));
     key.remove(placeholder);
@@ -56,4 +110,130 @@ QString fromFileKey(const QString& fileKey)
         return QStringLiteral("Calculator");
     const QString converted = ZemKeyServer::KeyStringXToQt(key);
     return converted.isEmpty() ? key : converted;
+}
+
+QString fileKeyOf(const QString& storedKey)
+{
+    const QKeySequence sequence = QKeySequence::fromString(storedKey, QKeySequence::NativeText);
+    QString keyString = ZemKeyServer::KeyQtToKeyStringX(sequence.isEmpty() ? 0 : sequence[0]);
+    if (keyString.isEmpty())
+        keyString = storedKey;
+    return toFileKey(keyString);
+}
+
+QString unquoted(const QString& text)
+{
+    const QLatin1Char quote('"');
+    if (text.size() >= 2 && text.startsWith(quote) && text.endsWith(quote))
+        return text.mid(1, text.size() - 2);
+    return text;
+}
+
+QByteArray foldedKey(const QByteArray& key)
+{
+    QByteArray folded = key;
+    for (char& c : folded) {
+        if (c >= 'A' && c <= 'Z')
+            c = char(c - 'A' + 'a');
+    }
+    return folded;
+}
+
+bool readHotkeysFile(const QString& path, QByteArray* bytes, QString* reason)
+{
+    if (path.isEmpty()) {
+        *reason = tr("No file name");
+        return false;
+    }
+    // Only regular files: a directory would be parsed as garbage, a device such as /dev/zero
+    // would never end, and opening a named pipe would wait for a writer.
+    const QFileInfo info(path);
+    if (!info.exists()) {
+        *reason = systemReason(ENOENT);
+        return false;
+    }
+    if (!info.isFile()) {
+        *reason = tr("Not a regular file");
+        return false;
+    }
+    if (info.size() > largestHotkeysFile) {
+        *reason = tr("The file is larger than 16 MiB");
+        return false;
+    }
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly)) {
+        *reason = file.errorString();
+        return false;
+    }
+    // The file may have grown since it was looked at; never read more than the limit allows.
+    *bytes = file.read(largestHotkeysFile + 1);
+    if (file.error() != QFileDevice::NoError) {
+        *reason = file.errorString();
+        return false;
+    }
+    if (bytes->size() > largestHotkeysFile) {
+        *reason = tr("The file is larger than 16 MiB");
+        return false;
+    }
+    if (bytes->contains('\0')) {
+        *reason = tr("The file holds NUL bytes");
+        return false;
+    }
+    return true;
+}
+
+bool writeFileSafely(const QString& path, const QByteArray& bytes, QString* reason)
+{
+    if (path.isEmpty()) {
+        *reason = tr("No file name");
+        return false;
+    }
+    const QString target = finalTarget(path);
+    const QFileInfo targetInfo(target);
+    if (targetInfo.isDir()) {
+        *reason = systemReason(EISDIR);
+        return false;
+    }
+    QByteArray temporary =
+        QFile::encodeName(targetInfo.absolutePath() + QLatin1String("/.") + targetInfo.fileName()) + ".XXXXXX";
+    const int fd = ::mkstemp(temporary.data());
+    if (fd < 0) {
+        *reason = systemReason(errno);
+        return false;
+    }
+
+    struct stat old;
+    bool ok = true;
+    if (::stat(QFile::encodeName(target).constData(), &old) == 0) {
+        ok = ::fchmod(fd, old.st_mode & 07777) == 0;
+        // Only root may give the file away; for anyone else the owner is already the same.
+        if (ok && ::fchown(fd, old.st_uid, old.st_gid) != 0 && errno != EPERM)
+            ok = false;
+    } else {
+        const mode_t mask = ::umask(0);
+        ::umask(mask);
+        ok = ::fchmod(fd, 0666 & ~mask) == 0;
+    }
+    ok = ok && writeAll(fd, bytes) && ::fsync(fd) == 0;
+    int error = ok ? 0 : errno;
+    if (::close(fd) != 0 && ok) {
+        ok = false;
+        error = errno;
+    }
+    if (ok && ::rename(temporary.constData(), QFile::encodeName(target).constData()) != 0) {
+        ok = false;
+        error = errno;
+    }
+    if (!ok) {
+        ::unlink(temporary.constData());
+        *reason = systemReason(error);
+        return false;
+    }
+    // The new name is on disk only once the directory is.
+    const int dir = ::open(QFile::encodeName(targetInfo.absolutePath()).constData(), O_RDONLY | O_DIRECTORY);
+    if (dir >= 0) {
+        ::fsync(dir);
+        ::close(dir);
+    }
+    return true;
 }

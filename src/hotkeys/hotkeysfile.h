@@ -1,11 +1,14 @@
 #pragma once
 
+#include <QByteArray>
 #include <QString>
 
 // The one section of a hotkeys file.
 inline constexpr char hotkeysSection[] = "ShortCutKeys";
 // What a newly created hotkeys file holds.
 inline constexpr char emptyHotkeysFile[] = "[ShortCutKeys]\n";
+// Larger files are no hotkeys files; refusing them early keeps a stray path from eating memory.
+inline constexpr qint64 largestHotkeysFile = 16 * 1024 * 1024;
 
 // The user's own hotkeys file, which is shown merged with the system one.
 QString userHotkeysFilePath();
@@ -17,3 +20,22 @@ QString toFileKey(const QString& keyString);
 // The key of a file entry to the stored key (QKeySequence portable text); empty for the
 // placeholder keys of keyless commands. Text that cannot be converted is kept as it is.
 QString fromFileKey(const QString& fileKey);
+// The file key a stored key is written under: its first key as the key server names it, or the
+// stored text itself when the key server cannot name it.
+QString fileKeyOf(const QString& storedKey);
+// A key or value without its enclosing double quotes; text that does not both begin and end
+// with one is taken whole, so an unclosed quote loses nothing.
+QString unquoted(const QString& text);
+// ASCII letters lower-cased, as the file compares keys.
+QByteArray foldedKey(const QByteArray& key);
+
+// Reads a whole hotkeys file; refuses anything but a regular file of at most
+// largestHotkeysFile bytes without NUL bytes, before reading it whole. On failure `reason`
+// says why, in the system's words where it has them.
+bool readHotkeysFile(const QString& path, QByteArray* bytes, QString* reason);
+
+// Replaces the file with the bytes, or leaves it exactly as it was: the bytes go to a new file
+// beside it, every write, the flush to disk and the close are checked, and only then does the
+// new file take the old one's name. Permissions and owner are kept; a symbolic link stays a
+// link and its target is replaced. On failure `reason` says why, in the system's words.
+bool writeFileSafely(const QString& path, const QByteArray& bytes, QString* reason);

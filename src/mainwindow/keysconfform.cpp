@@ -1,5 +1,6 @@
 #include "keysconfform.h"
 
+#include "bindingtree.h"
 #include "kkeysequencewidget.h"
 #include "zemhelpmenu.h"
 
@@ -60,6 +61,8 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags) : QMainWindow
     connect(keysTree->header(), &QHeaderView::customContextMenuRequested, this,
             &KeysConfForm::showHeaderMenu);
     mainLayout->addWidget(keysTree);
+    bindingTree = std::make_unique<BindingTree>(keysTree, &model);
+    bindingTree->setSourceTexts(userSource, systemSource);
 
     keyGroupBox = new QGroupBox(tr("Choose a Key for the Selected Action"), central);
     keyGroupBox->setObjectName(QStringLiteral("keyGroupBox"));
@@ -181,7 +184,6 @@ void KeysConfForm::disconnectKeyWidget()
 
 bool KeysConfForm::init(QString filepath)
 {
-    disabledKeys.clear();
     modified = false;
     fileSaveAction->setEnabled(false);
     fileApplyAction->setEnabled(false);
@@ -337,6 +339,17 @@ bool KeysConfForm::messageReceived(const QString&)
 }
 
 void KeysConfForm::grabKeys() {}
+
+void KeysConfForm::fillFunctionTree()
+{
+    bindingTree->rebuild();
+    commandGroupItem = bindingTree->commandGroup();
+}
+
+BindingId KeysConfForm::bindingAt(const QTreeWidgetItem* row) const
+{
+    return bindingTree->bindingAt(row);
+}
 
 QTreeWidgetItem* KeysConfForm::targetRow() const
 {

@@ -1,9 +1,14 @@
 #pragma once
 
+#include "hotkeysmodel.h"
+
 #include <QMainWindow>
 #include <QMessageBox>
 #include <QStringList>
 
+#include <memory>
+
+class BindingTree;
 class KKeySequenceWidget;
 class QAction;
 class QGroupBox;
@@ -18,8 +23,9 @@ class QTreeWidgetItem;
 class QVBoxLayout;
 
 // The editor's main window: the tree of window-manager functions and command entries with
-// their keys, the key panel below it, and the file commands. There is one per process, and its
-// editing state is class-wide.
+// their keys, the key panel below it, and the file commands. The bindings themselves live in a
+// HotkeysModel; the tree is a view of it. There is one window per process, and its editing
+// state is class-wide.
 class KeysConfForm : public QMainWindow
 {
     Q_OBJECT
@@ -35,10 +41,14 @@ public:
     static void setItemKey(QTreeWidgetItem* row, const QString& key);
 
     // Reads a hotkeys file (merged with the system one for the user's file) into the tree;
-    // false, with nothing changed, when it cannot be read.
+    // false, with nothing changed, when it cannot be read: loadFailure() then says which file
+    // failed and why.
     bool loadFile(const QString& path);
-    // Writes the tree to the current file; true when there was nothing to write.
+    QString loadFailure() const;
+    // Writes the bindings to the current file; true when there was nothing to write. A failure
+    // leaves the file as it was, and saveFailure() gives the reason.
     bool saveFile();
+    QString saveFailure() const { return saveError; }
     void fillFunctionTree();
     void updateTitle();
 
@@ -52,7 +62,8 @@ public:
     static QTreeWidgetItem* commandGroup() { return commandGroupItem; }
     static QString userSourceText() { return userSource; }
     static QString systemSourceText() { return systemSource; }
-    QStringList disabledKeyList() const { return disabledKeys; }
+    QStringList disabledKeyList() const { return model.disabledKeys(); }
+    const HotkeysModel& bindings() const { return model; }
 
 public slots:
     virtual void capturedKey(const QKeySequence& seq);
@@ -97,6 +108,9 @@ private:
     void saveWindowState();
     // The row the command operations act on: the first selected row, else the current one.
     QTreeWidgetItem* targetRow() const;
+    BindingId bindingAt(const QTreeWidgetItem* row) const;
+    // Copies a file's bytes onto currentFile through the same safe write as saving.
+    bool copyFile(const QString& from, QString* reason);
 
     QTreeWidget* keysTree = nullptr;
     QGroupBox* keyGroupBox = nullptr;
@@ -117,8 +131,12 @@ private:
     QAction* newCommandAction = nullptr;
     QAction* deleteCommandAction = nullptr;
     QAction* cloneCommandAction = nullptr;
-    QStringList disabledKeys;
     QVBoxLayout* mainLayout = nullptr;
+    HotkeysModel model;
+    std::unique_ptr<BindingTree> bindingTree;
+    QString failedPath;
+    QString loadError;
+    QString saveError;
 
     static QString userSource;
     static QString systemSource;

@@ -1,16 +1,11 @@
 #include "keysconfform.h"
 
+#include "bindingtree.h"
 #include "selectcommanddialog.h"
 
 #include <QGroupBox>
 #include <QMessageBox>
 #include <QTreeWidget>
-
-namespace {
-
-const QString execCommand = QStringLiteral("ExecCommand");
-
-} // namespace
 
 void KeysConfForm::newCommand()
 {
@@ -19,11 +14,7 @@ void KeysConfForm::newCommand()
     if (dialog.exec() != QDialog::Accepted || dialog.command().isEmpty())
         return;
 
-    auto* row = new QTreeWidgetItem();
-    commandGroupItem->addChild(row);
-    row->setText(0, dialog.command());
-    row->setText(2, execCommand);
-    row->setText(3, userSource);
+    QTreeWidgetItem* row = bindingTree->insert(model.addCommand(dialog.command()));
     keysTree->scrollToItem(row);
     keysTree->setCurrentItem(row);
     keyGroupBox->setEnabled(true);
@@ -47,24 +38,19 @@ void KeysConfForm::itemDoubleClicked(QTreeWidgetItem* clicked, int)
     if (dialog.exec() != QDialog::Accepted || dialog.command().isEmpty() ||
         dialog.command() == clicked->text(0))
         return;
-    clicked->setText(0, dialog.command());
-    clicked->setText(2, execCommand);
-    clicked->setText(3, userSource);
+    model.setCommand(bindingAt(clicked), dialog.command());
+    bindingTree->refresh(bindingAt(clicked));
     fileChanged();
 }
 
 void KeysConfForm::cloneCommand()
 {
     QTreeWidgetItem* target = targetRow();
-    QTreeWidgetItem* parent = target ? target->parent() : nullptr;
-    if (!parent)
+    if (!target || !target->parent())
         return;
-
-    auto* row = new QTreeWidgetItem();
-    parent->insertChild(parent->indexOfChild(target) + 1, row);
-    row->setText(0, target->text(0));
-    row->setText(2, target->text(2));
-    row->setText(3, userSource);
+    QTreeWidgetItem* row = bindingTree->insert(model.cloneRow(bindingAt(target)));
+    if (!row)
+        return;
     keysTree->scrollToItem(row);
     keysTree->setCurrentItem(row);
     keyGroupBox->setEnabled(true);
@@ -81,12 +67,10 @@ void KeysConfForm::deleteCommand()
                               QMessageBox::Yes | QMessageBox::No, QMessageBox::No) != QMessageBox::Yes)
         return;
 
-    // A system binding stays switched off once the user's file is saved. A row without a key
-    // binds nothing, and an empty disabled key would be written as a bogus entry.
-    if (target->text(3) == systemSource && !itemKey(target).isEmpty() &&
-        !disabledKeys.contains(itemKey(target)))
-        disabledKeys.append(itemKey(target));
-    delete target;
+    const BindingId id = bindingAt(target);
+    if (!model.removeRow(id))
+        return;
+    bindingTree->remove(id);
     keysTree->setCurrentItem(parent);
     parent->setSelected(true);
     fileChanged();

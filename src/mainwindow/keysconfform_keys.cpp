@@ -1,5 +1,6 @@
 #include "keysconfform.h"
 
+#include "bindingtree.h"
 #include "kkeysequencewidget.h"
 
 #include <QGroupBox>
@@ -7,7 +8,6 @@
 #include <QMessageBox>
 #include <QRadioButton>
 #include <QTreeWidget>
-#include <QTreeWidgetItemIterator>
 
 void KeysConfForm::itemSelected(QTreeWidgetItem* selected)
 {
@@ -60,33 +60,26 @@ void KeysConfForm::capturedKey(const QKeySequence& seq)
 
 void KeysConfForm::setKey(const QKeySequence& seq)
 {
-    QTreeWidgetItem* row = keysTree->currentItem();
-    if (!row || seq.isEmpty())
+    const BindingId id = bindingAt(keysTree->currentItem());
+    if (!id || seq.isEmpty())
         return;
     if (isKeyPresent(seq, true))
         return;
 
-    setItemKey(row, seq.toString(QKeySequence::PortableText));
-    row->setText(3, userSource);
+    model.setKey(id, seq.toString(QKeySequence::PortableText));
+    bindingTree->refresh(id);
     keyWidget->setKeySequence(seq, KKeySequenceWidget::NoValidate);
     fileChanged();
-    // A combination in use again is no longer disabled.
-    disabledKeys.removeAll(itemKey(row));
 }
 
 bool KeysConfForm::isKeyPresent(const QKeySequence& seq, bool warnuser)
 {
     if (!keysTree)
         return false;
-    const QString wanted = seq.toString(QKeySequence::PortableText).toLower();
-    QTreeWidgetItem* current = keysTree->currentItem();
-    QTreeWidgetItem* holder = nullptr;
-    for (QTreeWidgetItemIterator it(keysTree); *it; ++it) {
-        if (*it != current && itemKey(*it).toLower() == wanted) {
-            holder = *it;
-            break;
-        }
-    }
+    // Keys are compared as the file will hold them, so two rows can never end up on one key.
+    const BindingId holderId =
+        model.holderOf(seq.toString(QKeySequence::PortableText), bindingAt(keysTree->currentItem()));
+    QTreeWidgetItem* holder = bindingTree->rowOf(holderId);
     if (!holder)
         return false;
 
@@ -106,15 +99,11 @@ bool KeysConfForm::isKeyPresent(const QKeySequence& seq, bool warnuser)
 
 void KeysConfForm::opt_nokeys_checked()
 {
-    QTreeWidgetItem* row = keysTree->currentItem();
-    if (!row)
+    const BindingId id = bindingAt(keysTree->currentItem());
+    if (!id)
         return;
-    // A system binding stays switched off once the user's file is saved. A row without a key
-    // binds nothing, and an empty disabled key would be written as a bogus entry.
-    if (row->text(3) == systemSource && !itemKey(row).isEmpty() && !disabledKeys.contains(itemKey(row)))
-        disabledKeys.append(itemKey(row));
-    setItemKey(row, QString());
-    row->setText(3, userSource);
+    model.clearKey(id);
+    bindingTree->refresh(id);
     fileChanged();
     keyWidget->clearKeySequence();
     keyWidget->setEnabled(false);

@@ -1,5 +1,6 @@
 #include "keysconfform.h"
 
+#include "bindingtree.h"
 #include "hotkeysfile.h"
 #include "zemcore.h"
 #include "zemwmcommand.h"
@@ -9,8 +10,10 @@
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QMessageBox>
-#include <QProcess>
+#include <QTreeWidget>
 #include <QX11Info>
+
+#include <cstdio>
 
 void KeysConfForm::updateTitle()
 {
@@ -60,28 +63,93 @@ bool KeysConfForm::selectFile(bool forOpen)
     if (forOpen || QFileInfo::exists(currentFile))
         return true;
 
-    QFile file(currentFile);
-    if (!file.open(QIODevice::WriteOnly)) {
-        QMessageBox::warning(this, tr("Error"), tr("Can't create file ") + currentFile, QMessageBox::Ok);
+    QString reason;
+    if (!writeFileSafely(currentFile, QByteArray(), &reason)) {
+        QMessageBox::warning(this, tr("Error"), tr("Can't create file ") + currentFile + QLatin1Char('\n') + reason,
+                             QMessageBox::Ok);
         return false;
     }
     return true;
 }
 
+bool KeysConfForm::copyFile(const QString& from, QString* reason)
+{
+    QFile source(from);
+    if (!source.open(QIODevice::ReadOnly)) {
+        *reason = source.errorString();
+        return false;
+    }
+    const QByteArray bytes = source.read(largestHotkeysFile + 1);
+    if (source.error() != QFileDevice::NoError) {
+        *reason = source.errorString();
+        return false;
+    }
+    if (bytes.size() > largestHotkeysFile) {
+        *reason = tr("The file is larger than 16 MiB");
+        return false;
+    }
+    return writeFileSafely(currentFile, bytes, reason);
+}
+
 bool KeysConfForm::copyToCurrentFile(const QString& from)
 {
-    // Copying a file onto itself would only make cp complain.
+    // Copying a file onto itself would change nothing.
     if (QFileInfo(from).canonicalFilePath() == QFileInfo(currentFile).canonicalFilePath())
         return true;
-    // Started with an argument list, never through a shell: any path is only a path.
-    QProcess copy;
-    copy.start(QStringLiteral("/bin/cp"), {QStringLiteral("-f"), QStringLiteral("--"), from, currentFile});
-    const bool copied =
-        copy.waitForFinished(-1) && copy.exitStatus() == QProcess::NormalExit && copy.exitCode() == 0;
-    if (!copied)
-        QMessageBox::warning(this, tr("Error"), tr("Can't copy %1\nto %2").arg(from, currentFile),
-                             QMessageBox::Ok);
-    return copied;
+    // The copy goes through the same all-or-nothing write as saving: a full disk leaves the
+    // file it was to replace as it was.
+    QString reason;
+    if (copyFile(from, &reason))
+        return true;
+    QMessageBox::warning(this, tr("Error"), tr("Can't copy %1\nto %2").arg(from, currentFile) + QLatin1Char('\n') + reason,
+                         QMessageBox::Ok);
+    return false;
+}
+
+bool KeysConfForm::loadFile(const QString& path)
+{
+    if (path.isEmpty())
+        return false;
+    const QString systemPath = path == userHotkeysFilePath() ? systemHotkeysFilePath() : QString();
+    if (!model.load(path, systemPath, &failedPath, &loadError)) {
+        std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n", failedPath.toLocal8Bit().constData(),
+                     loadError.toLocal8Bit().constData());
+        return false;
+    }
+    std::fprintf(stderr, "files %s %s\n", path.toLocal8Bit().constData(), systemPath.toLocal8Bit().constData());
+
+    currentFile = path;
+    updateTitle();
+    keysTree->setUpdatesEnabled(false);
+    fillFunctionTree();
+    keysTree->setUpdatesEnabled(true);
+    modified = false;
+    fileSaveAction->setEnabled(false);
+    fileApplyAction->setEnabled(false);
+    return true;
+}
+
+QString KeysConfForm::loadFailure() const
+{
+    return loadError.isEmpty() ? failedPath : failedPath + QLatin1Char('\n') + loadError;
+}
+
+bool KeysConfForm::saveFile()
+{
+    if (!modified)
+        return true;
+    if (currentFile.isEmpty())
+        return false;
+    QByteArray bytes;
+    const bool composed = model.toBytes(currentFile == userHotkeysFilePath(), &bytes, &saveError);
+    // Keyless commands have been given their placeholder keys.
+    bindingTree->refreshCommands();
+    if (!composed || !writeFileSafely(currentFile, bytes, &saveError)) {
+        std::fprintf(stderr, "zem-admin-hotkeys: Can't save file %s\n", currentFile.toLocal8Bit().constData());
+        return false;
+    }
+    saveError.clear();
+    return true;
 }
 
 void KeysConfForm::fileNew()
@@ -111,10 +179,9 @@ bool KeysConfForm::loadCurrentFileOr(const QString& previous)
     if (loadFile(currentFile))
         return true;
     // The tree still shows the previous file: it stays the one that Save writes.
-    const QString unreadable = currentFile;
     currentFile = previous;
     updateTitle();
-    QMessageBox::warning(this, tr("Attention"), tr("Can't parse file:\n%1").arg(unreadable), QMessageBox::Ok);
+    QMessageBox::warning(this, tr("Attention"), tr("Can't parse file:\n%1").arg(loadFailure()), QMessageBox::Ok);
     return false;
 }
 
@@ -122,7 +189,9 @@ bool KeysConfForm::saveFileOrWarn()
 {
     if (saveFile())
         return true;
-    QMessageBox::warning(this, tr("Error"), tr("Can't save in file ") + currentFile, QMessageBox::Ok);
+    // The system's reason goes on a line of its own.
+    QMessageBox::warning(this, tr("Error"), tr("Can't save in file ") + currentFile + QLatin1Char('\n') + saveError,
+                         QMessageBox::Ok);
     return false;
 }
 

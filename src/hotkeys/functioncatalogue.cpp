@@ -1,4 +1,4 @@
-#include "wmfunctioncatalogue.h"
+#include "functioncatalogue.h"
 
 #include <QCoreApplication>
 

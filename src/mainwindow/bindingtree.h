@@ -1,0 +1,51 @@
+#pragma once
+
+#include "hotkeysmodel.h"
+
+#include <QHash>
+#include <QString>
+#include <QVector>
+
+class QTreeWidget;
+class QTreeWidgetItem;
+
+// Projects the bindings of a HotkeysModel into the window's tree: group rows and function rows
+// in catalogue order, the command group row last with the command rows below it. It is the
+// only code that writes tree items; everything else changes the model and asks it to follow.
+class BindingTree
+{
+public:
+    BindingTree(QTreeWidget* tree, const HotkeysModel* model);
+    Q_DISABLE_COPY(BindingTree)
+
+    void setSourceTexts(const QString& user, const QString& system);
+    // Empties the tree and builds it anew from the catalogue and the model.
+    void rebuild();
+    QTreeWidgetItem* commandGroup() const { return commandGroupRow; }
+
+    // 0 for group rows and rows the tree does not know.
+    BindingId bindingAt(const QTreeWidgetItem* row) const { return ids.value(row, 0); }
+    QTreeWidgetItem* rowOf(BindingId id) const { return rows.value(id, nullptr); }
+
+    // The row shows the binding as the model now has it.
+    void refresh(BindingId id);
+    void refreshCommands();
+    // A row for a binding the model has just gained, in the model's place for it.
+    QTreeWidgetItem* insert(BindingId id);
+    // Deletes the row of a binding the model has just lost.
+    void remove(BindingId id);
+
+private:
+    QTreeWidgetItem* makeRow(const Binding& binding);
+    void show(QTreeWidgetItem* row, const Binding& binding);
+
+    QTreeWidget* tree;
+    const HotkeysModel* model;
+    QString userText;
+    QString systemText;
+    QTreeWidgetItem* commandGroupRow = nullptr;
+    QVector<QTreeWidgetItem*> groupOfFunction;
+    QVector<QString> functionTexts;
+    QHash<const QTreeWidgetItem*, BindingId> ids;
+    QHash<BindingId, QTreeWidgetItem*> rows;
+};
