@@ -129,6 +129,20 @@ QString unquoted(const QString& text)
     return text;
 }
 
+bool isWritableFileKey(const QByteArray& key)
+{
+    const auto isBlank = [](char c) { return c == ' ' || c == '\t'; };
+    return !key.isEmpty() && !key.contains('\n') && !key.contains('\r') && !key.contains('\0') &&
+           !key.contains('=') && !isBlank(key.front()) && !isBlank(key.back()) && !QByteArray(";#[\"").contains(key.front());
+}
+
+bool readsBackAsWritten(const QString& storedKey)
+{
+    const QByteArray written = fileKeyOf(storedKey).toLocal8Bit();
+    return isWritableFileKey(written) &&
+           foldedKey(fileKeyOf(fromFileKey(QString::fromLocal8Bit(written))).toLocal8Bit()) == foldedKey(written);
+}
+
 QByteArray foldedKey(const QByteArray& key)
 {
     QByteArray folded = key;

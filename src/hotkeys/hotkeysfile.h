@@ -26,6 +26,12 @@ QString fileKeyOf(const QString& storedKey);
 // A key or value without its enclosing double quotes; text that does not both begin and end
 // with one is taken whole, so an unclosed quote loses nothing.
 QString unquoted(const QString& text);
+// Whether a key of the editor's making reads back as written: not empty, on one line, no "=",
+// no blank at either end, and not looking like a comment, a section or a quoted key.
+bool isWritableFileKey(const QByteArray& key);
+// Whether the stored key is written under a file key that reads back as the same file key. Not
+// so for a few keys the key server cannot name (a keypad "|" would be written "Num||").
+bool readsBackAsWritten(const QString& storedKey);
 // ASCII letters lower-cased, as the file compares keys.
 QByteArray foldedKey(const QByteArray& key);
 

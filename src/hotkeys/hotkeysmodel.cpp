@@ -63,8 +63,11 @@ std::shared_ptr<const EntryOrigin> originOf(const HotkeysLines& lines, const QHa
     const HotkeysLine& line = lines.lines().at(i);
     auto origin = std::make_shared<EntryOrigin>();
     origin->leading = lines.span(lines.leadingStart(i), line.start);
-    origin->line = lines.span(line.start, line.end);
-    origin->rawKey = line.key;
+    // A key written twice in other letter case is read with the spelling of its first line and
+    // the value of its last; the line is then composed from the two.
+    if (line.key == entry.key)
+        origin->line = lines.span(line.start, line.end);
+    origin->rawKey = entry.key;
     origin->rawValue = line.value;
     origin->readKey = key;
     origin->readAction = action;
@@ -73,17 +76,17 @@ std::shared_ptr<const EntryOrigin> originOf(const HotkeysLines& lines, const QHa
     return origin;
 }
 
-// A line the reader would read back as this key and value, or why there is none.
-QString unwritable(const QByteArray& key, const QByteArray& value)
+// Why a line of the editor's making would not read back as this key and value; empty when it
+// would. Keys read from a file are written as they were read and need no check; placeholders
+// are read back as no key, as they should.
+QString unwritable(const QString& storedKey, const QByteArray& key, bool keyFromFile, const QByteArray& value)
 {
-    const auto hasLineBreak = [](const QByteArray& text) {
-        return text.contains('\n') || text.contains('\r') || text.contains('\0');
-    };
-    const auto isBlank = [](char c) { return c == ' ' || c == '\t'; };
-    if (key.isEmpty() || hasLineBreak(key) || key.contains('=') || isBlank(key.front()) || isBlank(key.back()) ||
-        key.front() == ';' || key.front() == '#' || key.front() == '[')
+    static const QRegularExpression placeholder(QStringLiteral("^None[0-9]+$"));
+    if (!keyFromFile && !(placeholder.match(storedKey).hasMatch() ? isWritableFileKey(key) : readsBackAsWritten(storedKey)))
         return tr("The key \"%1\" cannot be written to a hotkeys file").arg(QString::fromLocal8Bit(key));
-    if (hasLineBreak(value) || (!value.isEmpty() && (isBlank(value.front()) || isBlank(value.back()))))
+    const auto isBlank = [](char c) { return c == ' ' || c == '\t'; };
+    if (value.contains('\n') || value.contains('\r') || value.contains('\0') ||
+        (!value.isEmpty() && (isBlank(value.front()) || isBlank(value.back()))))
         return tr("The action \"%1\" cannot be written to a hotkeys file").arg(QString::fromLocal8Bit(value));
     return QString();
 }
@@ -425,6 +428,8 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
         QByteArray value;
         QByteArray leading;
         QByteArray verbatim;
+        bool keyFromFile = false;
+        QString storedKey;
     };
     QVector<Line> out;
     QHash<QByteArray, int> written;
@@ -455,6 +460,8 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
             continue;
         Line line;
         line.key = writtenKey(row->key, origin);
+        line.keyFromFile = keyKept && !origin->rawKey.isEmpty();
+        line.storedKey = row->key;
         if (actionKept)
             line.value = origin->rawValue;
         else if (row->isCommand())
@@ -472,6 +479,8 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
         const EntryOrigin* origin = key.origin.get();
         Line line;
         line.key = writtenKey(key.key, origin);
+        line.keyFromFile = origin && key.key == origin->readKey;
+        line.storedKey = key.key;
         line.value = "\"Disable\"";
         if (origin && origin->editedFile && origin->readAction == disableValue && key.key == origin->readKey) {
             line.leading = origin->leading;
@@ -482,7 +491,7 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
     // What was read but not shown follows, unless a shown binding took its key since.
     for (const Kept& entry : qAsConst(kept)) {
         if (!written.contains(entry.foldedKey))
-            put({entry.origin->rawKey, entry.origin->rawValue, entry.origin->leading, entry.origin->line});
+            put({entry.origin->rawKey, entry.origin->rawValue, entry.origin->leading, entry.origin->line, true, QString()});
     }
 
     QByteArray result = beforeSection + sectionHeader;
@@ -492,7 +501,7 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
             result += withLineEnd(line.verbatim);
             continue;
         }
-        const QString problem = unwritable(line.key, line.value);
+        const QString problem = unwritable(line.storedKey, line.key, line.keyFromFile, line.value);
         if (!problem.isEmpty()) {
             *reason = problem;
             return false;
@@ -500,6 +509,9 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
         result += line.key + '=' + line.value + '\n';
     }
     result += sectionEnd + otherSections + afterLast;
+    // No byte-order mark is written, not even one that stood inside the file and came first.
+    if (result.startsWith("\xEF\xBB\xBF"))
+        result.remove(0, 3);
     *bytes = result;
     return true;
 }
