@@ -1,9 +1,9 @@
 #include "zemcore.h"
 
-#include <QGuiApplication>
 #include <QByteArray>
 #include <QDir>
 #include <QFileInfo>
+#include <QGuiApplication>
 #include <QIcon>
 #include <QLibraryInfo>
 #include <QLocale>

@@ -73,8 +73,11 @@ int main(int argc, char** argv)
     // Created all or nothing: a full disk must not leave an empty file that no later start can read.
     QString reason;
     if (!QFile::exists(path) && !writeFileSafely(path, emptyHotkeysFile, &reason)) {
+        std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n", path.toLocal8Bit().constData(),
+                     reason.toLocal8Bit().constData());
         QMessageBox::warning(nullptr, QObject::tr("Attention"),
-                             QObject::tr("Can't open/create file:\n%1").arg(path) + QLatin1Char('\n') + reason,
+                             QObject::tr("Can't open/create file:\n%1").arg(path) + QLatin1Char('\n') +
+                                 reason,
                              QMessageBox::Ok);
         delete form;
         delete app;

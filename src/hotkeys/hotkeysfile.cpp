@@ -133,14 +133,16 @@ bool isWritableFileKey(const QByteArray& key)
 {
     const auto isBlank = [](char c) { return c == ' ' || c == '\t'; };
     return !key.isEmpty() && !key.contains('\n') && !key.contains('\r') && !key.contains('\0') &&
-           !key.contains('=') && !isBlank(key.front()) && !isBlank(key.back()) && !QByteArray(";#[\"").contains(key.front());
+           !key.contains('=') && !isBlank(key.front()) && !isBlank(key.back()) &&
+           !QByteArray(";#[\"").contains(key.front());
 }
 
 bool readsBackAsWritten(const QString& storedKey)
 {
     const QByteArray written = fileKeyOf(storedKey).toLocal8Bit();
     return isWritableFileKey(written) &&
-           foldedKey(fileKeyOf(fromFileKey(QString::fromLocal8Bit(written))).toLocal8Bit()) == foldedKey(written);
+           foldedKey(fileKeyOf(fromFileKey(QString::fromLocal8Bit(written))).toLocal8Bit()) ==
+               foldedKey(written);
 }
 
 QByteArray foldedKey(const QByteArray& key)
@@ -209,7 +211,8 @@ bool writeFileSafely(const QString& path, const QByteArray& bytes, QString* reas
         return false;
     }
     QByteArray temporary =
-        QFile::encodeName(targetInfo.absolutePath() + QLatin1String("/.") + targetInfo.fileName()) + ".XXXXXX";
+        QFile::encodeName(targetInfo.absolutePath() + QLatin1String("/.") + targetInfo.fileName()) +
+        ".XXXXXX";
     const int fd = ::mkstemp(temporary.data());
     if (fd < 0) {
         *reason = systemReason(errno);

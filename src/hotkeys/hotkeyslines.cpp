@@ -28,7 +28,9 @@ HotkeysLines::HotkeysLines(const QByteArray& bytes) : data(bytes)
     int line = 1;
     int section = -1;
     // Steps over one line end, "\r\n" counting as one.
-    const auto newLineLength = [&](int at) { return d[at] == '\r' && at + 1 < size && d[at + 1] == '\n' ? 2 : 1; };
+    const auto newLineLength = [&](int at) {
+        return d[at] == '\r' && at + 1 < size && d[at + 1] == '\n' ? 2 : 1;
+    };
     // Skips blanks and line ends from `at`; `lineStart` follows the line ends passed.
     const auto skipSpaces = [&](int at, int* lineStart, bool crossLines) {
         while (at < size && isSpace(d[at]) && (crossLines || !isNewLine(d[at]))) {

@@ -9,13 +9,13 @@ struct HotkeysLine
     enum Kind { Section, Entry };
 
     Kind kind = Entry;
-    int number = 0;   // line number of its first line, counted from 1
-    int start = 0;    // its bytes: whole lines, line ends included
+    int number = 0; // line number of its first line, counted from 1
+    int start = 0;  // its bytes: whole lines, line ends included
     int end = 0;
-    int section = -1; // entries: index of their section header among the lines; -1 before any
+    int section = -1;  // entries: index of their section header among the lines; -1 before any
     bool valid = true; // sections: false for a "[" never closed on its line
     QByteArray name;   // sections: the name, trimmed
-    QByteArray key;   // entries: key and value, trimmed as the reader trims them
+    QByteArray key;    // entries: key and value, trimmed as the reader trims them
     QByteArray value;
 };
 

@@ -82,7 +82,8 @@ std::shared_ptr<const EntryOrigin> originOf(const HotkeysLines& lines, const QHa
 QString unwritable(const QString& storedKey, const QByteArray& key, bool keyFromFile, const QByteArray& value)
 {
     static const QRegularExpression placeholder(QStringLiteral("^None[0-9]+$"));
-    if (!keyFromFile && !(placeholder.match(storedKey).hasMatch() ? isWritableFileKey(key) : readsBackAsWritten(storedKey)))
+    if (!keyFromFile &&
+        !(placeholder.match(storedKey).hasMatch() ? isWritableFileKey(key) : readsBackAsWritten(storedKey)))
         return tr("The key \"%1\" cannot be written to a hotkeys file").arg(QString::fromLocal8Bit(key));
     const auto isBlank = [](char c) { return c == ' ' || c == '\t'; };
     if (value.contains('\n') || value.contains('\r') || value.contains('\0') ||
@@ -149,8 +150,8 @@ bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBy
     const HotkeysLines lines(bytes);
     const QVector<HotkeysLine>& all = lines.lines();
     int header = -1;
-    const auto firstSection = std::find_if(all.cbegin(), all.cend(),
-                                           [](const HotkeysLine& line) { return line.kind == HotkeysLine::Section; });
+    const auto firstSection = std::find_if(
+        all.cbegin(), all.cend(), [](const HotkeysLine& line) { return line.kind == HotkeysLine::Section; });
     if (firstSection != all.cend())
         fresh.beforeSection =
             withLineEnd(lines.span(lines.textStart(), lines.leadingStart(int(firstSection - all.cbegin()))));
@@ -212,7 +213,8 @@ bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBy
                     first.source = source;
                     first.origin = origin;
                 } else {
-                    furtherRows[function].append(Binding{++fresh.lastId, function, QString(), key, source, origin});
+                    furtherRows[function].append(
+                        Binding{++fresh.lastId, function, QString(), key, source, origin});
                 }
             } else if (value == disableValue) {
                 if (key.isEmpty()) {
@@ -285,7 +287,8 @@ QStringList HotkeysModel::disabledKeys() const
 
 bool HotkeysModel::isDisabled(const QString& key) const
 {
-    return std::any_of(disabled.cbegin(), disabled.cend(), [&](const DisabledKey& d) { return d.key == key; });
+    return std::any_of(disabled.cbegin(), disabled.cend(),
+                       [&](const DisabledKey& d) { return d.key == key; });
 }
 
 QByteArray HotkeysModel::writtenKey(const QString& key, const EntryOrigin* origin) const
@@ -326,8 +329,9 @@ void HotkeysModel::setKey(BindingId id, const QString& key)
     row->key = key;
     row->source = BindingSource::User;
     // A combination in use again is no longer disabled.
-    disabled.erase(std::remove_if(disabled.begin(), disabled.end(), [&](const DisabledKey& d) { return d.key == key; }),
-                   disabled.end());
+    disabled.erase(
+        std::remove_if(disabled.begin(), disabled.end(), [&](const DisabledKey& d) { return d.key == key; }),
+        disabled.end());
 }
 
 void HotkeysModel::clearKey(BindingId id)
@@ -360,7 +364,8 @@ BindingId HotkeysModel::cloneRow(BindingId id)
     const auto cloneIn = [&](QVector<Binding>& rows) -> BindingId {
         for (int i = 0; i < rows.size(); ++i) {
             if (rows.at(i).id == id) {
-                Binding copy{++lastId, rows.at(i).function, rows.at(i).command, QString(), BindingSource::User, nullptr};
+                Binding copy{++lastId,  rows.at(i).function, rows.at(i).command,
+                             QString(), BindingSource::User, nullptr};
                 rows.insert(i + 1, copy);
                 return copy.id;
             }
@@ -482,7 +487,8 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
         line.keyFromFile = origin && key.key == origin->readKey;
         line.storedKey = key.key;
         line.value = "\"Disable\"";
-        if (origin && origin->editedFile && origin->readAction == disableValue && key.key == origin->readKey) {
+        if (origin && origin->editedFile && origin->readAction == disableValue &&
+            key.key == origin->readKey) {
             line.leading = origin->leading;
             line.verbatim = origin->line;
         }
@@ -491,7 +497,8 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
     // What was read but not shown follows, unless a shown binding took its key since.
     for (const Kept& entry : qAsConst(kept)) {
         if (!written.contains(entry.foldedKey))
-            put({entry.origin->rawKey, entry.origin->rawValue, entry.origin->leading, entry.origin->line, true, QString()});
+            put({entry.origin->rawKey, entry.origin->rawValue, entry.origin->leading, entry.origin->line,
+                 true, QString()});
     }
 
     QByteArray result = beforeSection + sectionHeader;

@@ -19,11 +19,11 @@ enum class BindingSource {
 // byte for byte.
 struct EntryOrigin
 {
-    QByteArray leading;  // comment and blank lines above it
-    QByteArray line;     // its whole line, line end included
-    QByteArray rawKey;   // key and value as written, trimmed
+    QByteArray leading; // comment and blank lines above it
+    QByteArray line;    // its whole line, line end included
+    QByteArray rawKey;  // key and value as written, trimmed
     QByteArray rawValue;
-    QString readKey;     // the stored key and the action it was read as
+    QString readKey; // the stored key and the action it was read as
     QString readAction;
     int lineNumber = 0;
     bool editedFile = false; // read from the edited file, not the system file

@@ -9,6 +9,8 @@
 #include <QMessageBox>
 #include <QToolButton>
 
+int KKeySequenceWidgetPrivate::releaseDelayMs = 600;
+
 KKeySequenceWidgetPrivate::KKeySequenceWidgetPrivate(KKeySequenceWidget* q) : owner(q) {}
 
 void KKeySequenceWidgetPrivate::setup()

@@ -30,7 +30,9 @@ public:
     // The sequence with one more key; a full sequence stays as it is.
     static QKeySequence appendKey(const QKeySequence& seq, int key);
 
-    static constexpr int releaseDelayMs = 600;
+    // How long a recording waits after the last key is let go. Tests shorten it; the program
+    // never changes it.
+    static int releaseDelayMs;
     static constexpr int longestSequence = 4;
 
     KKeySequenceWidget* owner;

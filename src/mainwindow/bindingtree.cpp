@@ -43,8 +43,8 @@ void BindingTree::rebuild()
         }
     }
     //: The group row under which the user's command entries are listed.
-    commandGroupRow = new QTreeWidgetItem({QCoreApplication::translate("KeysConfForm", "Command Keybindings"),
-                                           QString(), QString()});
+    commandGroupRow = new QTreeWidgetItem(
+        {QCoreApplication::translate("KeysConfForm", "Command Keybindings"), QString(), QString()});
     QList<QTreeWidgetItem*> commandRows;
     for (const Binding& binding : model->commands())
         commandRows.append(makeRow(binding));
@@ -96,8 +96,10 @@ QTreeWidgetItem* BindingTree::insert(BindingId id)
     const Binding* binding = model->find(id);
     if (!binding || rows.contains(id))
         return rowOf(id);
-    const QVector<Binding>& siblings = binding->isCommand() ? model->commands() : model->rowsOf(binding->function);
-    QTreeWidgetItem* parent = binding->isCommand() ? commandGroupRow : groupOfFunction.value(binding->function);
+    const QVector<Binding>& siblings =
+        binding->isCommand() ? model->commands() : model->rowsOf(binding->function);
+    QTreeWidgetItem* parent =
+        binding->isCommand() ? commandGroupRow : groupOfFunction.value(binding->function);
     if (!parent)
         return nullptr;
     int place = 0;

@@ -65,7 +65,8 @@ bool KeysConfForm::selectFile(bool forOpen)
 
     QString reason;
     if (!writeFileSafely(currentFile, QByteArray(), &reason)) {
-        QMessageBox::warning(this, tr("Error"), tr("Can't create file ") + currentFile + QLatin1Char('\n') + reason,
+        QMessageBox::warning(this, tr("Error"),
+                             tr("Can't create file ") + currentFile + QLatin1Char('\n') + reason,
                              QMessageBox::Ok);
         return false;
     }
@@ -101,7 +102,8 @@ bool KeysConfForm::copyToCurrentFile(const QString& from)
     QString reason;
     if (copyFile(from, &reason))
         return true;
-    QMessageBox::warning(this, tr("Error"), tr("Can't copy %1\nto %2").arg(from, currentFile) + QLatin1Char('\n') + reason,
+    QMessageBox::warning(this, tr("Error"),
+                         tr("Can't copy %1\nto %2").arg(from, currentFile) + QLatin1Char('\n') + reason,
                          QMessageBox::Ok);
     return false;
 }
@@ -116,7 +118,8 @@ bool KeysConfForm::loadFile(const QString& path)
                      loadError.toLocal8Bit().constData());
         return false;
     }
-    std::fprintf(stderr, "files %s %s\n", path.toLocal8Bit().constData(), systemPath.toLocal8Bit().constData());
+    std::fprintf(stderr, "files %s %s\n", path.toLocal8Bit().constData(),
+                 systemPath.toLocal8Bit().constData());
 
     currentFile = path;
     updateTitle();
@@ -145,7 +148,8 @@ bool KeysConfForm::saveFile()
     // Keyless commands have been given their placeholder keys.
     bindingTree->refreshCommands();
     if (!composed || !writeFileSafely(currentFile, bytes, &saveError)) {
-        std::fprintf(stderr, "zem-admin-hotkeys: Can't save file %s\n", currentFile.toLocal8Bit().constData());
+        std::fprintf(stderr, "zem-admin-hotkeys: Can't save file %s\n",
+                     currentFile.toLocal8Bit().constData());
         return false;
     }
     saveError.clear();
@@ -181,7 +185,8 @@ bool KeysConfForm::loadCurrentFileOr(const QString& previous)
     // The tree still shows the previous file: it stays the one that Save writes.
     currentFile = previous;
     updateTitle();
-    QMessageBox::warning(this, tr("Attention"), tr("Can't parse file:\n%1").arg(loadFailure()), QMessageBox::Ok);
+    QMessageBox::warning(this, tr("Attention"), tr("Can't parse file:\n%1").arg(loadFailure()),
+                         QMessageBox::Ok);
     return false;
 }
 
@@ -190,7 +195,8 @@ bool KeysConfForm::saveFileOrWarn()
     if (saveFile())
         return true;
     // The system's reason goes on a line of its own.
-    QMessageBox::warning(this, tr("Error"), tr("Can't save in file ") + currentFile + QLatin1Char('\n') + saveError,
+    QMessageBox::warning(this, tr("Error"),
+                         tr("Can't save in file ") + currentFile + QLatin1Char('\n') + saveError,
                          QMessageBox::Ok);
     return false;
 }

@@ -6,12 +6,12 @@
 
 TestEnvironment::TestEnvironment() : dir(QDir::tempPath() + QLatin1String("/zem-test-XXXXXX"))
 {
-    QDir().mkpath(configHome());
-    QDir().mkpath(userDir());
-    QDir().mkpath(systemDir());
-    qputenv("XDG_CONFIG_HOME", QFile::encodeName(configHome()));
-    qputenv("ZEM_USER_DIR", QFile::encodeName(userDir()));
-    qputenv("ZEM_SYSTEM_DIR", QFile::encodeName(systemDir()));
+    for (const auto& [variable, name] : {std::pair{"XDG_CONFIG_HOME", "/config"},
+                                         {"ZEM_USER_DIR", "/user"},
+                                         {"ZEM_SYSTEM_DIR", "/system"}}) {
+        QDir().mkpath(dir.path() + QLatin1String(name));
+        qputenv(variable, QFile::encodeName(dir.path() + QLatin1String(name)));
+    }
     qunsetenv("ZEM_SESSION_SUFFIX");
 }
 

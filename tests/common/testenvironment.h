@@ -12,11 +12,6 @@ class TestEnvironment
 public:
     TestEnvironment();
 
-    QString root() const { return dir.path(); }
-    QString configHome() const { return dir.path() + QLatin1String("/config"); }
-    QString userDir() const { return dir.path() + QLatin1String("/user"); }
-    QString systemDir() const { return dir.path() + QLatin1String("/system"); }
-
 private:
     QTemporaryDir dir;
 };

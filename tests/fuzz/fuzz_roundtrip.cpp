@@ -11,7 +11,8 @@ QStringList listing(const HotkeysModel& model)
     QStringList rows;
     for (const Binding* row : model.rows()) {
         if (row->isCommand() || !row->key.isEmpty())
-            rows << QString::number(row->function) + QLatin1Char('|') + row->command + QLatin1Char('|') + row->key;
+            rows << QString::number(row->function) + QLatin1Char('|') + row->command + QLatin1Char('|') +
+                        row->key;
     }
     return rows + model.disabledKeys();
 }

@@ -1,0 +1,295 @@
+// What is the window's own: the key panel, the conflict box, the row actions, the questions,
+// the Save and Apply states and what a failed write tells the user. The file rules themselves
+// are the core's and tested there.
+#include "keysconfform.h"
+#include "kkeysequencewidget.h"
+#include "modalanswerer.h"
+#include "testenvironment.h"
+
+#include <QAction>
+#include <QGroupBox>
+#include <QLineEdit>
+#include <QPushButton>
+#include <QRadioButton>
+#include <QTreeWidget>
+#include <QTreeWidgetItemIterator>
+#include <QtTest>
+
+Q_DECLARE_METATYPE(QMessageBox::StandardButton)
+
+namespace {
+
+// What the window manager has been sent, as xprop shows it; taken away afterwards.
+QByteArray takeRootProperty()
+{
+    QProcess xprop;
+    xprop.start(QStringLiteral("xprop"),
+                {QStringLiteral("-root"), QStringLiteral("-notype"), QStringLiteral("_ZEMWM_COMMAND")});
+    xprop.waitForFinished();
+    QProcess::execute(QStringLiteral("xprop"),
+                      {QStringLiteral("-root"), QStringLiteral("-remove"), QStringLiteral("_ZEMWM_COMMAND")});
+    const QByteArray shown = xprop.readAllStandardOutput();
+    return shown.startsWith("_ZEMWM_COMMAND = ") ? shown.mid(17).trimmed() : QByteArray();
+}
+
+} // namespace
+
+class TestMainWindow : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void init();
+    void cleanup();
+    void selectionShowsTheRow_data();
+    void selectionShowsTheRow();
+    void recordedKeyAndConflict();
+    void clearedSystemKeyStaysOff();
+    void saveAndApplyStates();
+    void failedWriteKeepsEdits_data();
+    void failedWriteKeepsEdits();
+    void closeQuestion_data();
+    void closeQuestion();
+    void commandEntries();
+
+private:
+    QTreeWidgetItem* row(const QString& name, int index = 0) const;
+    void select(const QString& name, int index = 0) const
+    {
+        form->findChild<QTreeWidget*>()->setCurrentItem(row(name, index));
+    }
+    QAction* action(const char* name) const { return form->findChild<QAction*>(QLatin1String(name)); }
+    KKeySequenceWidget* keyWidget() const { return form->findChild<KKeySequenceWidget*>(); }
+    bool saveEnabled() const
+    {
+        return action("fileSaveAction")->isEnabled() && action("fileApplyAction")->isEnabled();
+    }
+
+    std::unique_ptr<KeysConfForm> form;
+    QString userFile;
+};
+
+void TestMainWindow::init()
+{
+    const QString system =
+        QString::fromLocal8Bit(qgetenv("ZEM_SYSTEM_DIR")) + QLatin1String("/keyshortcutrc");
+    userFile = QString::fromLocal8Bit(qgetenv("ZEM_USER_DIR")) + QLatin1String("/keyshortcutrc");
+    QDir(userFile).removeRecursively();
+    QVERIFY(writeFile(system, "[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\nCtrl|k=ZEMWM_KILL\n"));
+    QVERIFY(writeFile(userFile, "[ShortCutKeys]\nAlt|F5=ZEMWM_LOCK\nCtrl|Alt|x=\"xclock\"\n"));
+    form = std::make_unique<KeysConfForm>();
+    QVERIFY(form->init(userFile));
+    form->show();
+    QVERIFY(QTest::qWaitForWindowExposed(form.get()));
+    takeRootProperty();
+}
+
+void TestMainWindow::cleanup()
+{
+    form.reset();
+}
+
+QTreeWidgetItem* TestMainWindow::row(const QString& name, int index) const
+{
+    for (QTreeWidgetItemIterator it(form->findChild<QTreeWidget*>()); *it; ++it) {
+        const bool match =
+            name.startsWith(QLatin1String("cmd:"))
+                ? (*it)->parent() == KeysConfForm::commandGroup() && (*it)->text(0) == name.mid(4)
+                : (*it)->text(2) == name || (name == QLatin1String("group") && !(*it)->parent());
+        if (match && index-- == 0)
+            return *it;
+    }
+    return nullptr;
+}
+
+void TestMainWindow::selectionShowsTheRow_data()
+{
+    QTest::addColumn<QString>("rowName");
+    QTest::addColumn<QString>("actions"); // N new, C clone, E edit, D delete
+    QTest::addColumn<QString>("panel");   // "" disabled, else the checked radio and the key shown
+
+    // Each starts from ZEMWM_LOCK selected, which shows Alt+F5.
+    QTest::newRow("function with a key") << "ZEMWM_LOCK"
+                                         << "C"
+                                         << "assign Alt+F5";
+    QTest::newRow("function without key") << "ZEMWM_EXIT"
+                                          << "C"
+                                          << "clear None";
+    QTest::newRow("group row") << "group"
+                               << ""
+                               << "";
+    QTest::newRow("command group row") << "commands"
+                                       << "N"
+                                       << "";
+    QTest::newRow("command row") << "cmd:xclock"
+                                 << "NCED"
+                                 << "assign Ctrl+Alt+X";
+}
+
+void TestMainWindow::selectionShowsTheRow()
+{
+    QFETCH(QString, rowName);
+    QFETCH(QString, actions);
+    QFETCH(QString, panel);
+    select(QStringLiteral("ZEMWM_LOCK"));
+    form->findChild<QTreeWidget*>()->setCurrentItem(
+        rowName == QLatin1String("commands") ? KeysConfForm::commandGroup() : row(rowName));
+    QString shown;
+    for (const auto& [name, letter] : {std::pair{"newCommandAction", 'N'},
+                                       {"cloneCommandAction", 'C'},
+                                       {"editCommandAction", 'E'},
+                                       {"deleteCommandAction", 'D'}})
+        shown += action(name)->isEnabled() ? QString(QLatin1Char(letter)) : QString();
+    QCOMPARE(shown, actions);
+    QCOMPARE(form->findChild<QGroupBox*>("keyGroupBox")->isEnabled(), !panel.isEmpty());
+    if (!panel.isEmpty()) {
+        QCOMPARE(form->findChild<QRadioButton*>("customKeyRadio")->isChecked(), panel.startsWith("assign"));
+        QCOMPARE(form->findChild<QPushButton*>("recordButton")->text(),
+                 QLatin1Char(' ') + panel.section(' ', 1) + ' ');
+    }
+    QVERIFY(!KeysConfForm::isModified());
+    // A clone gives a function a second row, and either of them may then be deleted.
+    if (actions == QLatin1String("C")) {
+        action("cloneCommandAction")->trigger();
+        QCOMPARE(form->findChild<QTreeWidget*>()->currentItem(), row(rowName, 1));
+        QVERIFY(action("deleteCommandAction")->isEnabled());
+    }
+}
+
+void TestMainWindow::recordedKeyAndConflict()
+{
+    select(QStringLiteral("ZEMWM_EXIT"));
+    ModalAnswerer answerer;
+    // A combination the system file holds in another spelling is refused.
+    keyWidget()->setKeySequence(QKeySequence(QStringLiteral("Ctrl+K")), KKeySequenceWidget::NoValidate);
+    QCOMPARE(answerer.count(), 1);
+    QCOMPARE(answerer.last().title, QStringLiteral("Whoopsie! Key conflict."));
+    QCOMPARE(answerer.last().text,
+             QStringLiteral(
+                 "Ouch! The Ctrl+K key combination has already been allocated\nto the ZEMWM_KILL action "
+                 "(close a window forcely).\n\nPlease choose a unique key combination."));
+    QVERIFY(KeysConfForm::itemKey(row("ZEMWM_EXIT")).isEmpty());
+
+    keyWidget()->setKeySequence(QKeySequence(QStringLiteral("Ctrl+Alt+E")), KKeySequenceWidget::NoValidate);
+    QCOMPARE(answerer.count(), 1);
+    QCOMPARE(KeysConfForm::itemKey(row("ZEMWM_EXIT")), QStringLiteral("Ctrl+Alt+E"));
+    QCOMPARE(row("ZEMWM_EXIT")->text(3), QStringLiteral("user"));
+    QVERIFY(KeysConfForm::isModified() && saveEnabled());
+}
+
+void TestMainWindow::clearedSystemKeyStaysOff()
+{
+    select(QStringLiteral("ZEMWM_CLOSE"));
+    QTest::mouseClick(form->findChild<QRadioButton*>("noKeyRadio"), Qt::LeftButton);
+    QCOMPARE(row("ZEMWM_CLOSE")->text(1), QString());
+    QCOMPARE(row("ZEMWM_CLOSE")->text(3), QStringLiteral("user"));
+    QCOMPARE(form->disabledKeyList(), QStringList{"Alt+F4"});
+    QVERIFY(!keyWidget()->isEnabled());
+}
+
+void TestMainWindow::saveAndApplyStates()
+{
+    QVERIFY(!saveEnabled());
+    select(QStringLiteral("ZEMWM_EXIT"));
+    form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
+    QVERIFY(saveEnabled());
+    form->fileSave();
+    QVERIFY(!KeysConfForm::isModified());
+    QVERIFY(saveEnabled());
+    QVERIFY(readFile(userFile).contains("Ctrl|Alt|e=ZEMWM_EXIT\n"));
+
+    form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+F")));
+    form->fileApply();
+    QVERIFY(!KeysConfForm::isModified() && !saveEnabled());
+    QCOMPARE(takeRootProperty(), "\"ZEMWM_UPDATE_VAL SCKeysFile " + QFile::encodeName(userFile) + "\\n\"");
+}
+
+void TestMainWindow::failedWriteKeepsEdits_data()
+{
+    QTest::addColumn<QString>("command");
+    QTest::newRow("Save") << "save";
+    QTest::newRow("Apply") << "apply";
+    QTest::newRow("Yes on closing") << "close";
+}
+
+void TestMainWindow::failedWriteKeepsEdits()
+{
+    QFETCH(QString, command);
+    select(QStringLiteral("ZEMWM_EXIT"));
+    form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
+    // The file's place is taken by a directory: the write fails, and says why.
+    QVERIFY(QFile::remove(userFile) && QDir().mkpath(userFile));
+
+    ModalAnswerer answerer({QMessageBox::Yes, QMessageBox::Ok});
+    if (command == QLatin1String("save"))
+        form->fileSave();
+    else if (command == QLatin1String("apply"))
+        form->fileApply();
+    else
+        QVERIFY(!form->close());
+    QCOMPARE(answerer.last().title, QStringLiteral("Error"));
+    QCOMPARE(answerer.last().text, QStringLiteral("Can't save in file %1\nIs a directory").arg(userFile));
+    QVERIFY(KeysConfForm::isModified() && saveEnabled());
+    QVERIFY(form->isVisible());
+    QCOMPARE(takeRootProperty(), QByteArray());
+}
+
+void TestMainWindow::closeQuestion_data()
+{
+    QTest::addColumn<QMessageBox::StandardButton>("answer");
+    QTest::addColumn<bool>("closed");
+    QTest::addColumn<bool>("saved");
+    QTest::newRow("Yes saves and closes") << QMessageBox::Yes << true << true;
+    QTest::newRow("No closes without saving") << QMessageBox::No << true << false;
+    QTest::newRow("Cancel keeps the window and the edits") << QMessageBox::Cancel << false << false;
+}
+
+void TestMainWindow::closeQuestion()
+{
+    QFETCH(QMessageBox::StandardButton, answer);
+    QFETCH(bool, closed);
+    QFETCH(bool, saved);
+    const QByteArray before = readFile(userFile);
+    select(QStringLiteral("ZEMWM_EXIT"));
+    form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
+
+    ModalAnswerer answerer({answer});
+    QCOMPARE(form->close(), closed);
+    QCOMPARE(answerer.titles(), QStringList{"Save ?"});
+    QCOMPARE(answerer.last().text, QStringLiteral("Save previous changes?"));
+    QCOMPARE(readFile(userFile) != before, saved);
+    QCOMPARE(KeysConfForm::isModified(), !saved);
+}
+
+void TestMainWindow::commandEntries()
+{
+    QString typed = QStringLiteral("xeyes  -fg   red");
+    ModalAnswerer answerer({QMessageBox::Yes});
+    answerer.onOtherDialog([&](QDialog* dialog) {
+        dialog->findChild<QLineEdit*>()->setText(typed);
+        dialog->accept();
+    });
+    action("newCommandAction")->trigger();
+    QTreeWidgetItem* added = row(QStringLiteral("cmd:xeyes -fg red"));
+    QVERIFY(added);
+    QCOMPARE(form->findChild<QTreeWidget*>()->currentItem(), added);
+    QVERIFY(form->findChild<QRadioButton*>("noKeyRadio")->isChecked());
+
+    // Edit keeps the row's key and place; Delete asks first.
+    select(QStringLiteral("cmd:xclock"));
+    typed = QStringLiteral("xclock -digital");
+    action("editCommandAction")->trigger();
+    QCOMPARE(KeysConfForm::commandGroup()->child(0)->text(0), typed);
+    QCOMPARE(KeysConfForm::itemKey(KeysConfForm::commandGroup()->child(0)), QStringLiteral("Ctrl+Alt+X"));
+    action("deleteCommandAction")->trigger();
+    QCOMPARE(answerer.last().title, QStringLiteral("Delete"));
+    QVERIFY(!row(QStringLiteral("cmd:xclock -digital")));
+    QCOMPARE(form->findChild<QTreeWidget*>()->currentItem(), KeysConfForm::commandGroup());
+
+    form->fileSave();
+    QCOMPARE(readFile(userFile),
+             QByteArray("[ShortCutKeys]\nAlt|F5=ZEMWM_LOCK\nNone|None0=\"xeyes -fg red\"\n"));
+}
+
+ZEM_TEST_MAIN(TestMainWindow)
+#include "tst_mainwindow.moc"
