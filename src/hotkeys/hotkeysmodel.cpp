@@ -236,6 +236,10 @@ bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBy
     if (withSystem)
         addEntries(systemDocument, BindingSource::System);
 
+    // What is kept unseen is written back in the order of the file.
+    std::stable_sort(fresh.kept.begin(), fresh.kept.end(),
+                     [](const Kept& a, const Kept& b) { return a.origin->lineNumber < b.origin->lineNumber; });
+
     // A function's further rows follow its first row, the one read last nearest to it.
     for (auto it = furtherRows.cbegin(); it != furtherRows.cend(); ++it)
         std::copy(it->crbegin(), it->crend(), std::back_inserter(fresh.functionRows[it.key()]));

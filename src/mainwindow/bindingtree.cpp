@@ -1,9 +1,9 @@
 #include "bindingtree.h"
 
 #include "functioncatalogue.h"
-#include "keysconfform.h"
 
 #include <QCoreApplication>
+#include <QKeySequence>
 #include <QTreeWidget>
 
 BindingTree::BindingTree(QTreeWidget* tree, const HotkeysModel* model) : tree(tree), model(model) {}
@@ -72,9 +72,19 @@ void BindingTree::show(QTreeWidgetItem* row, const Binding& binding)
         row->setText(0, functionTexts.value(binding.function));
         row->setText(2, HotkeysModel::functionNames().at(binding.function));
     }
-    KeysConfForm::setItemKey(row, binding.key);
+    showKey(row, binding.key);
     if (binding.source != BindingSource::Unset)
         row->setText(3, binding.source == BindingSource::System ? systemText : userText);
+}
+
+void BindingTree::showKey(QTreeWidgetItem* row, const QString& key)
+{
+    if (!row)
+        return;
+    row->setData(1, Qt::UserRole, key);
+    const QString shown =
+        QKeySequence::fromString(key, QKeySequence::NativeText).toString(QKeySequence::NativeText);
+    row->setText(1, shown.isEmpty() ? key : shown);
 }
 
 void BindingTree::refresh(BindingId id)

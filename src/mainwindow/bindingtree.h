@@ -27,6 +27,9 @@ public:
     BindingId bindingAt(const QTreeWidgetItem* row) const { return ids.value(row, 0); }
     QTreeWidgetItem* rowOf(BindingId id) const { return rows.value(id, nullptr); }
 
+    // Puts a stored key into a row: at Qt::UserRole of the key column, and as its shown text, which
+    // is the key in the desktop's own words or, when Qt cannot read it, the text as it stands.
+    static void showKey(QTreeWidgetItem* row, const QString& key);
     // The row shows the binding as the model now has it.
     void refresh(BindingId id);
     void refreshCommands();

@@ -249,12 +249,7 @@ QString KeysConfForm::itemKey(const QTreeWidgetItem* row)
 
 void KeysConfForm::setItemKey(QTreeWidgetItem* row, const QString& key)
 {
-    if (!row)
-        return;
-    row->setData(1, Qt::UserRole, key);
-    const QString shown =
-        QKeySequence::fromString(key, QKeySequence::NativeText).toString(QKeySequence::NativeText);
-    row->setText(1, shown.isEmpty() ? key : shown);
+    BindingTree::showKey(row, key);
 }
 
 void KeysConfForm::itemSelectionChanged()

@@ -116,11 +116,12 @@ void TestHotkeysModel::writeBack_data()
                "None|KP_Equal=ZEMWM_EXIT\nNone|odiaeresis=ZEMWM_REBOOT\nNone|mu=ZEMWM_SHUTDOWN\n"
                "Ctrl|Alt|d=ZEMWM_DPMS_ON\nCtrl|l=\"echo caf\xe9\"\nNone|;|F7=\"semi\"\n|=\"bar\"\n");
     QTest::newRow("what is not shown stays: comments, unknown functions, other sections")
-        << QByteArray("; mine\n[ShortCutKeys]\r\n# close it\r\n Alt|F4 = ZEMWM_CLOSE \r\nAlt|n=ZEMWM_NEWER\n"
+        << QByteArray("; mine\n[ShortCutKeys]\r\n# close it\r\n Alt|F4 = ZEMWM_CLOSE "
+                      "\r\nAlt|n=ZEMWM_NEWER\nAlt|b=ZEMWM_BETA\n"
                       "[Other]\nx=y\n; tail\n")
         << "key|ZEMWM_LOCK|Ctrl+L"
         << QByteArray("; mine\n[ShortCutKeys]\r\n# close it\r\n Alt|F4 = ZEMWM_CLOSE \r\nCtrl|l=ZEMWM_LOCK\n"
-                      "Alt|n=ZEMWM_NEWER\n[Other]\nx=y\n; tail\n");
+                      "Alt|n=ZEMWM_NEWER\nAlt|b=ZEMWM_BETA\n[Other]\nx=y\n; tail\n");
     QTest::newRow("a shown binding takes the key of an unknown function")
         << QByteArray("[ShortCutKeys]\nAlt|n=ZEMWM_NEWER\n") << "key|ZEMWM_LOCK|Alt+N"
         << QByteArray("[ShortCutKeys]\nAlt|n=ZEMWM_LOCK\n");
