@@ -40,7 +40,6 @@ class TestMainWindow : public QObject
 
 private slots:
     void init();
-    void cleanup();
     void selectionShowsTheRow_data();
     void selectionShowsTheRow();
     void recordedKeyAndConflict();
@@ -51,6 +50,7 @@ private slots:
     void closeQuestion_data();
     void closeQuestion();
     void commandEntries();
+    void saveAsAndRestore();
 
 private:
     QTreeWidgetItem* row(const QString& name, int index = 0) const;
@@ -77,16 +77,12 @@ void TestMainWindow::init()
     QDir(userFile).removeRecursively();
     QVERIFY(writeFile(system, "[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\nCtrl|k=ZEMWM_KILL\n"));
     QVERIFY(writeFile(userFile, "[ShortCutKeys]\nAlt|F5=ZEMWM_LOCK\nCtrl|Alt|x=\"xclock\"\n"));
+    form.reset(); // one main window at a time: its state is class-wide
     form = std::make_unique<KeysConfForm>();
     QVERIFY(form->init(userFile));
     form->show();
     QVERIFY(QTest::qWaitForWindowExposed(form.get()));
     takeRootProperty();
-}
-
-void TestMainWindow::cleanup()
-{
-    form.reset();
 }
 
 QTreeWidgetItem* TestMainWindow::row(const QString& name, int index) const
@@ -289,6 +285,26 @@ void TestMainWindow::commandEntries()
     form->fileSave();
     QCOMPARE(readFile(userFile),
              QByteArray("[ShortCutKeys]\nAlt|F5=ZEMWM_LOCK\nNone|None0=\"xeyes -fg red\"\n"));
+}
+
+void TestMainWindow::saveAsAndRestore()
+{
+    select(QStringLiteral("ZEMWM_EXIT"));
+    form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
+    const QString other = QFileInfo(userFile).path() + QLatin1String("/other.rc");
+    ModalAnswerer answerer({QMessageBox::Ok}, {other});
+    form->fileSaveAs();
+    // Another file holds every binding shown, the system's too, and is the one edited now.
+    QCOMPARE(KeysConfForm::editedFile(), other);
+    QCOMPARE(readFile(other),
+             QByteArray("[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\nCtrl|k=ZEMWM_KILL\nAlt|F5=ZEMWM_LOCK\n"
+                        "Ctrl|Alt|e=ZEMWM_EXIT\nCtrl|Alt|x=\"xclock\"\n"));
+    // Restore puts the system file in the place of the user's and edits that.
+    form->fileRestore();
+    QCOMPARE(readFile(userFile),
+             readFile(QFileInfo(userFile).path() + QLatin1String("/../system/keyshortcutrc")));
+    QCOMPARE(KeysConfForm::editedFile(), userFile);
+    QCOMPARE(answerer.count(), 0);
 }
 
 ZEM_TEST_MAIN(TestMainWindow)
