@@ -127,20 +127,24 @@ bool HotkeysModel::load(const QString& path, const QString& systemPath, QString*
     // Editing the user's file needs the system file it is merged with.
     if (!systemPath.isEmpty() && !readHotkeysFile(systemPath, &systemBytes, reason))
         return fail(systemPath, *reason);
-    HotkeysDocument probe;
-    if (!probe.load(bytes))
-        return fail(path, tr("No [ShortCutKeys] section"));
-    if (!systemPath.isEmpty() && !probe.load(systemBytes))
-        return fail(systemPath, tr("No [ShortCutKeys] section"));
-    return loadBytes(bytes, systemBytes, !systemPath.isEmpty());
+    bool systemFailed = false;
+    if (!loadBytes(bytes, systemBytes, !systemPath.isEmpty(), &systemFailed))
+        return fail(systemFailed ? systemPath : path, tr("No [ShortCutKeys] section"));
+    return true;
 }
 
-bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBytes, bool withSystem)
+bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBytes, bool withSystem,
+                             bool* systemFailed)
 {
     HotkeysDocument mainDocument;
     HotkeysDocument systemDocument;
-    if (!mainDocument.load(bytes) || (withSystem && !systemDocument.load(systemBytes)))
+    if (!mainDocument.load(bytes))
         return false;
+    if (withSystem && !systemDocument.load(systemBytes)) {
+        if (systemFailed)
+            *systemFailed = true;
+        return false;
+    }
 
     HotkeysModel fresh;
     fresh.lastId = lastId;
@@ -237,8 +241,9 @@ bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBy
         addEntries(systemDocument, BindingSource::System);
 
     // What is kept unseen is written back in the order of the file.
-    std::stable_sort(fresh.kept.begin(), fresh.kept.end(),
-                     [](const Kept& a, const Kept& b) { return a.origin->lineNumber < b.origin->lineNumber; });
+    std::stable_sort(fresh.kept.begin(), fresh.kept.end(), [](const Kept& a, const Kept& b) {
+        return a.origin->lineNumber < b.origin->lineNumber;
+    });
 
     // A function's further rows follow its first row, the one read last nearest to it.
     for (auto it = furtherRows.cbegin(); it != furtherRows.cend(); ++it)

@@ -60,8 +60,10 @@ public:
     // Reads the file, merged with the system file when systemPath is not empty. On failure
     // the model is unchanged, and failedPath and reason say which file and why.
     bool load(const QString& path, const QString& systemPath, QString* failedPath, QString* reason);
-    // Merges already read bytes; false when one of them is no hotkeys file.
-    bool loadBytes(const QByteArray& bytes, const QByteArray& systemBytes, bool withSystem);
+    // Merges already read bytes; false when one of them is no hotkeys file, and then
+    // systemFailed says whether it was the system file.
+    bool loadBytes(const QByteArray& bytes, const QByteArray& systemBytes, bool withSystem,
+                   bool* systemFailed = nullptr);
 
     static const QStringList& functionNames();
     const QVector<Binding>& rowsOf(int function) const { return functionRows.at(function); }

@@ -141,8 +141,10 @@ bool KeysConfForm::saveFile()
 {
     if (!modified)
         return true;
-    if (currentFile.isEmpty())
+    if (currentFile.isEmpty()) {
+        saveError = tr("No file name");
         return false;
+    }
     QByteArray bytes;
     const bool composed = model.toBytes(currentFile == userHotkeysFilePath(), &bytes, &saveError);
     // Keyless commands have been given their placeholder keys.
