@@ -8,6 +8,7 @@
 #include <QMessageBox>
 
 #include <cstdio>
+#include <cstring>
 
 namespace {
 
@@ -17,12 +18,39 @@ enum ExitStatus {
     CreationDeclined = 2,
     CreationFailed = 3,
     LoadFailed = 4,
+    NoDisplay = 5,
 };
+
+bool isHelp(const char* argument)
+{
+    return std::strcmp(argument, "--help") == 0 || std::strcmp(argument, "-h") == 0;
+}
+
+int printUsage()
+{
+    const QString usage =
+        QObject::tr("Usage: zem-admin-hotkeys filepath - open/create file as hotkeys coll\n");
+    std::fputs(usage.toLocal8Bit().constData(), stdout);
+    std::fputs("\n", stdout);
+    std::fflush(stdout);
+    return UsageShown;
+}
 
 } // namespace
 
 int main(int argc, char** argv)
 {
+    // Without a display Qt would abort in the application object; the usage needs none, and
+    // anything else is told in one line.
+    const QByteArray display = displayToOpen(argc, argv);
+    if (!display.isNull()) {
+        QCoreApplication core(argc, argv);
+        if (argc > 1 && isHelp(argv[1]))
+            return printUsage();
+        std::fprintf(stderr, "zem-admin-hotkeys: cannot open the X display \"%s\"\n", display.constData());
+        return NoDisplay;
+    }
+
     auto* app = new MyApplication(singleInstanceId(), argc, argv);
     if (app->isRunning()) {
         app->sendMessage(QStringLiteral("show"), 5000);
@@ -36,15 +64,9 @@ int main(int argc, char** argv)
     QStringList arguments;
     for (int i = 1; i < argc; ++i)
         arguments << QString::fromLocal8Bit(argv[i]);
-    if (!arguments.isEmpty() &&
-        (arguments.first() == QLatin1String("--help") || arguments.first() == QLatin1String("-h"))) {
-        const QString usage =
-            QObject::tr("Usage: zem-admin-hotkeys filepath - open/create file as hotkeys coll\n");
-        std::fputs(usage.toLocal8Bit().constData(), stdout);
-        std::fputs("\n", stdout);
-        std::fflush(stdout);
+    if (argc > 1 && isHelp(argv[1])) {
         delete app;
-        return UsageShown;
+        return printUsage();
     }
 
     auto* form = new KeysConfForm();
@@ -94,6 +116,9 @@ int main(int argc, char** argv)
 
     QObject::connect(app, &MyApplication::messageReceived, form, &KeysConfForm::messageReceived);
     QObject::connect(app, &QGuiApplication::lastWindowClosed, app, &QCoreApplication::quit);
+    // The session's end asks about unsaved edits itself, once, instead of closing the window.
+    QGuiApplication::setFallbackSessionManagementEnabled(false);
+    QObject::connect(app, &QGuiApplication::commitDataRequest, form, &KeysConfForm::commitData);
 
     form->show();
     const int result = app->exec();

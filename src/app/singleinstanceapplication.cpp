@@ -3,13 +3,21 @@
 #include <QCryptographicHash>
 #include <QDataStream>
 #include <QDeadlineTimer>
-#include <QDir>
+#include <QFile>
 #include <QLocalServer>
 #include <QLocalSocket>
 #include <QLockFile>
 #include <QPointer>
 #include <QThread>
 
+#include <QSysInfo>
+
+#include <cerrno>
+#include <csignal>
+#include <cstdio>
+#include <sys/socket.h>
+#include <sys/stat.h>
+#include <sys/un.h>
 #include <unistd.h>
 
 namespace {
@@ -24,28 +32,76 @@ QString serverNameFor(const QString& id)
     // The id may hold anything DISPLAY holds ("/" included); a digest makes it a safe name.
     const QByteArray digest =
         QCryptographicHash::hash(id.toUtf8(), QCryptographicHash::Sha1).toHex().left(16);
-    return QStringLiteral("zem-admin-hotkeys-%1-%2")
-        .arg(QString::number(::getuid()), QString::fromLatin1(digest));
+    return QStringLiteral("zem-admin-hotkeys-%1").arg(QString::fromLatin1(digest));
+}
+
+// A directory that only this user can use, for the lock and the socket: $XDG_RUNTIME_DIR, else
+// one of the user's own in the temporary directory. A path that another account owns, that
+// others may write to, or that would make the socket's name too long is passed over.
+QString privateDirectory(const QString& name)
+{
+    const uid_t uid = ::getuid();
+    const auto usable = [&](const QByteArray& path) {
+        struct stat info;
+        // A socket path longer than sockaddr_un allows would be cut.
+        const bool fits =
+            path.size() + 1 + QFile::encodeName(name).size() + 5 < int(sizeof(sockaddr_un::sun_path));
+        return fits && ::lstat(path.constData(), &info) == 0 && S_ISDIR(info.st_mode) && info.st_uid == uid &&
+               (info.st_mode & 077) == 0;
+    };
+    const QByteArray runtime = qgetenv("XDG_RUNTIME_DIR");
+    if (!runtime.isEmpty() && usable(runtime))
+        return QFile::decodeName(runtime);
+    for (const QByteArray& base : {qgetenv("TMPDIR"), QByteArray("/tmp")}) {
+        if (base.isEmpty())
+            continue;
+        const QByteArray dir = base + "/zem-admin-hotkeys-" + QByteArray::number(uid);
+        ::mkdir(dir.constData(), 0700);
+        if (usable(dir))
+            return QFile::decodeName(dir);
+    }
+    return QString();
 }
 
 } // namespace
 
 SingleInstanceApplication::SingleInstanceApplication(const QString& id, int& argc, char** argv)
-    : QApplication(argc, argv), appId(id), serverName(serverNameFor(id)),
-      lock(std::make_unique<QLockFile>(QDir::temp().filePath(serverName + QLatin1String(".lock"))))
+    : QApplication(argc, argv), appId(id)
 {
+    const QString name = serverNameFor(id);
+    const QString dir = privateDirectory(name);
+    if (dir.isEmpty()) {
+        std::fprintf(stderr,
+                     "zem-admin-hotkeys: no private directory for the instance lock; starting anyway\n");
+        return;
+    }
+    serverName = dir + QLatin1Char('/') + name;
+    lock = std::make_unique<QLockFile>(serverName + QLatin1String(".lock"));
     // Stale only when its owner is gone, never by age: an editor may stay open for weeks.
     lock->setStaleLockTime(0);
-    if (!lock->tryLock(0))
+    if (!lock->tryLock(0)) {
+        // Only a live editor of this machine holding the lock makes this start a second one; a
+        // lock that cannot be made, or a file in its place that names no such editor, must not
+        // keep the user from the editor.
+        qint64 pid = 0;
+        QString host;
+        QString application;
+        anotherRuns = lock->error() == QLockFile::LockFailedError &&
+                      lock->getLockInfo(&pid, &host, &application) && host == QSysInfo::machineHostName() &&
+                      pid > 0 && (::kill(pid_t(pid), 0) == 0 || errno == EPERM);
+        if (!anotherRuns)
+            std::fprintf(stderr, "zem-admin-hotkeys: cannot make the instance lock %s; starting anyway\n",
+                         QFile::encodeName(serverName).constData());
         return;
+    }
 
     server = new QLocalServer(this);
     server->setSocketOptions(QLocalServer::UserAccessOption);
     // We hold the lock, so a socket left under this name belongs to a crashed instance.
     QLocalServer::removeServer(serverName);
     if (!server->listen(serverName)) {
-        qWarning("zem-admin-hotkeys: cannot listen for other instances: %s",
-                 qPrintable(server->errorString()));
+        std::fprintf(stderr, "zem-admin-hotkeys: cannot listen for other instances: %s\n",
+                     server->errorString().toLocal8Bit().constData());
         return;
     }
     connect(server, &QLocalServer::newConnection, this, &SingleInstanceApplication::acceptConnections);
@@ -59,7 +115,7 @@ SingleInstanceApplication::~SingleInstanceApplication()
 
 bool SingleInstanceApplication::isRunning() const
 {
-    return !lock->isLocked();
+    return anotherRuns;
 }
 
 bool SingleInstanceApplication::sendMessage(const QString& message, int timeoutMs)

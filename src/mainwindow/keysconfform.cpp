@@ -8,6 +8,7 @@
 #include <QButtonGroup>
 #include <QCloseEvent>
 #include <QContextMenuEvent>
+#include <QFileSystemWatcher>
 #include <QGroupBox>
 #include <QHBoxLayout>
 #include <QHeaderView>
@@ -15,7 +16,9 @@
 #include <QMenu>
 #include <QMenuBar>
 #include <QRadioButton>
+#include <QSessionManager>
 #include <QSettings>
+#include <QTimer>
 #include <QToolBar>
 #include <QTreeWidget>
 #include <QTreeWidgetItemIterator>
@@ -160,6 +163,15 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags) : QMainWindow
     connect(newCommandAction, &QAction::triggered, this, &KeysConfForm::newCommand);
     connect(fileApplyAction, &QAction::triggered, this, &KeysConfForm::fileApply);
     connect(cloneCommandAction, &QAction::triggered, this, &KeysConfForm::cloneCommand);
+
+    // Changes on disk come in bursts (a write, a rename); they are gathered for a moment.
+    watcher = new QFileSystemWatcher(this);
+    changeTimer = new QTimer(this);
+    changeTimer->setSingleShot(true);
+    changeTimer->setInterval(300);
+    connect(watcher, &QFileSystemWatcher::fileChanged, changeTimer, qOverload<>(&QTimer::start));
+    connect(watcher, &QFileSystemWatcher::directoryChanged, changeTimer, qOverload<>(&QTimer::start));
+    connect(changeTimer, &QTimer::timeout, this, &KeysConfForm::filesChangedOnDisk);
 }
 
 KeysConfForm::~KeysConfForm()
@@ -322,6 +334,16 @@ void KeysConfForm::closeEvent(QCloseEvent* event)
         event->ignore();
     else
         event->accept();
+}
+
+void KeysConfForm::commitData(QSessionManager& manager)
+{
+    if (!modified || !manager.allowsInteraction())
+        return;
+    const QMessageBox::StandardButton answer = askSaveChanges();
+    manager.release();
+    if (answer == QMessageBox::Cancel)
+        manager.cancel();
 }
 
 bool KeysConfForm::messageReceived(const QString&)

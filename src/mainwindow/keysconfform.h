@@ -11,12 +11,15 @@
 class BindingTree;
 class KKeySequenceWidget;
 class QAction;
+class QFileSystemWatcher;
+class QTimer;
 class QGroupBox;
 class QKeySequence;
 class QMenu;
 class QMenuBar;
 class QPoint;
 class QRadioButton;
+class QSessionManager;
 class QToolBar;
 class QTreeWidget;
 class QTreeWidgetItem;
@@ -92,6 +95,9 @@ public slots:
     virtual QTreeWidgetItem* setActionsEnabled(QTreeWidgetItem* item);
 
     bool messageReceived(const QString& message);
+    // The desktop session ends: unsaved edits are offered for saving as when the window closes,
+    // and Cancel keeps the session from ending.
+    void commitData(QSessionManager& manager);
 
 protected:
     void closeEvent(QCloseEvent* event) override;
@@ -109,8 +115,18 @@ private:
     // The row the command operations act on: the first selected row, else the current one.
     QTreeWidgetItem* targetRow() const;
     BindingId bindingAt(const QTreeWidgetItem* row) const;
-    // Copies a file's bytes onto currentFile through the same safe write as saving.
-    bool copyFile(const QString& from, QString* reason);
+    // Remembers what the edited file (and the system file it is merged with) now hold, and
+    // watches them for changes by other programs.
+    void watchFiles();
+    void rewatch();
+    bool changedOnDisk() const;
+    void filesChangedOnDisk();
+    void reloadKeepingSelection();
+    // Before a save: false when the file changed on disk and the user chose not to overwrite it
+    // (Reload loads it as it is now).
+    bool mayOverwrite();
+    // Copies a file's bytes through the same safe write as saving; says so when it fails.
+    bool copyFile(const QString& from, const QString& to);
 
     QTreeWidget* keysTree = nullptr;
     QGroupBox* keyGroupBox = nullptr;
@@ -137,6 +153,12 @@ private:
     QString failedPath;
     QString loadError;
     QString saveError;
+    QFileSystemWatcher* watcher = nullptr;
+    QTimer* changeTimer = nullptr;
+    QString watchedFile;
+    QByteArray watchedDigest;
+    QString watchedSystem;
+    QByteArray systemDigest;
 
     static QString userSource;
     static QString systemSource;

@@ -13,6 +13,7 @@
 #include <QTreeWidget>
 #include <QX11Info>
 
+#include <algorithm>
 #include <cstdio>
 
 void KeysConfForm::updateTitle()
@@ -73,39 +74,37 @@ bool KeysConfForm::selectFile(bool forOpen)
     return true;
 }
 
-bool KeysConfForm::copyFile(const QString& from, QString* reason)
+bool KeysConfForm::copyFile(const QString& from, const QString& to)
 {
-    QFile source(from);
-    if (!source.open(QIODevice::ReadOnly)) {
-        *reason = source.errorString();
-        return false;
+    // Copying a file onto itself would change nothing.
+    const QString source = QFileInfo(from).canonicalFilePath();
+    if (!source.isEmpty() && source == QFileInfo(to).canonicalFilePath())
+        return true;
+    // The copy goes through the same all-or-nothing write as saving: a full disk leaves the
+    // file it was to replace as it was.
+    QFile file(from);
+    QString reason;
+    QByteArray bytes;
+    if (!file.open(QIODevice::ReadOnly)) {
+        reason = file.errorString();
+    } else {
+        bytes = file.read(largestHotkeysFile + 1);
+        if (file.error() != QFileDevice::NoError)
+            reason = file.errorString();
+        else if (bytes.size() > largestHotkeysFile)
+            reason = tr("The file is larger than 16 MiB");
     }
-    const QByteArray bytes = source.read(largestHotkeysFile + 1);
-    if (source.error() != QFileDevice::NoError) {
-        *reason = source.errorString();
-        return false;
-    }
-    if (bytes.size() > largestHotkeysFile) {
-        *reason = tr("The file is larger than 16 MiB");
-        return false;
-    }
-    return writeFileSafely(currentFile, bytes, reason);
+    if (reason.isEmpty() && writeFileSafely(to, bytes, &reason))
+        return true;
+    QMessageBox::warning(this, tr("Error"),
+                         tr("Can't copy %1\nto %2").arg(from, to) + QLatin1Char('\n') + reason,
+                         QMessageBox::Ok);
+    return false;
 }
 
 bool KeysConfForm::copyToCurrentFile(const QString& from)
 {
-    // Copying a file onto itself would change nothing.
-    if (QFileInfo(from).canonicalFilePath() == QFileInfo(currentFile).canonicalFilePath())
-        return true;
-    // The copy goes through the same all-or-nothing write as saving: a full disk leaves the
-    // file it was to replace as it was.
-    QString reason;
-    if (copyFile(from, &reason))
-        return true;
-    QMessageBox::warning(this, tr("Error"),
-                         tr("Can't copy %1\nto %2").arg(from, currentFile) + QLatin1Char('\n') + reason,
-                         QMessageBox::Ok);
-    return false;
+    return copyFile(from, currentFile);
 }
 
 bool KeysConfForm::loadFile(const QString& path)
@@ -129,6 +128,7 @@ bool KeysConfForm::loadFile(const QString& path)
     modified = false;
     fileSaveAction->setEnabled(false);
     fileApplyAction->setEnabled(false);
+    watchFiles();
     return true;
 }
 
@@ -155,6 +155,7 @@ bool KeysConfForm::saveFile()
         return false;
     }
     saveError.clear();
+    watchFiles();
     return true;
 }
 
@@ -194,6 +195,8 @@ bool KeysConfForm::loadCurrentFileOr(const QString& previous)
 
 bool KeysConfForm::saveFileOrWarn()
 {
+    if (modified && !mayOverwrite())
+        return false;
     if (saveFile())
         return true;
     // The system's reason goes on a line of its own.
@@ -221,12 +224,24 @@ void KeysConfForm::fileSaveAs()
 
 void KeysConfForm::fileRestore()
 {
+    // One click would otherwise wipe every binding the user ever saved.
+    if (QMessageBox::question(
+            this, tr("Restore"),
+            tr("Replace your hotkeys file with the system one?\nAll your own bindings in it will "
+               "be lost."),
+            QMessageBox::Yes | QMessageBox::Cancel) != QMessageBox::Yes)
+        return;
     if (modified && QMessageBox::question(this, tr("Save ?"), tr("All changes will be lost. Save them?"),
                                           QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes)
         fileSaveAs();
 
     const QString previous = currentFile;
     currentFile = userHotkeysFilePath();
+    // The replaced file stays beside it, so that even a confirmed Restore can be taken back.
+    if (QFileInfo::exists(currentFile) && !copyFile(currentFile, currentFile + QLatin1Char('~'))) {
+        currentFile = previous;
+        return;
+    }
     copyToCurrentFile(systemHotkeysFilePath());
     if (loadCurrentFileOr(previous))
         fileChanged();
@@ -234,6 +249,17 @@ void KeysConfForm::fileRestore()
 
 void KeysConfForm::fileApply()
 {
+    // The command is one line: a line break in the path would start a command of its own.
+    const QByteArray command = "ZEMWM_UPDATE_VAL SCKeysFile " + currentFile.toLocal8Bit() + '\n';
+    if (std::any_of(command.cbegin(), command.cend() - 1,
+                    [](char c) { return uchar(c) < 0x20 || c == 0x7f; }) ||
+        command.size() > 4096) {
+        QMessageBox::warning(this, tr("Error"),
+                             tr("The window manager cannot be told to use this file: its name holds control "
+                                "characters or is too long.\nSave it under another name."),
+                             QMessageBox::Ok);
+        return;
+    }
     // Nothing is handed to the window manager that was not written.
     if (!saveFileOrWarn())
         return;
@@ -247,8 +273,10 @@ void KeysConfForm::fileApply()
                                  .arg(currentFile, startupFile),
                              QMessageBox::Ok);
     }
-    const QByteArray command = "ZEMWM_UPDATE_VAL SCKeysFile " + currentFile.toLocal8Bit() + '\n';
-    SendCommandToWM(QX11Info::display(), command.constData());
+    if (!SendCommandToWM(QX11Info::display(), command.constData()))
+        QMessageBox::warning(this, tr("Error"),
+                             tr("The window manager could not be told to reload %1.").arg(currentFile),
+                             QMessageBox::Ok);
 }
 
 void KeysConfForm::fileClose()

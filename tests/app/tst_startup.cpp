@@ -2,6 +2,7 @@
 // key presses through xdotool, its exit statuses, what it prints and what it leaves on disk.
 #include "testenvironment.h"
 
+#include <QCryptographicHash>
 #include <QElapsedTimer>
 #include <QProcess>
 #include <QtTest>
@@ -16,6 +17,7 @@ private slots:
     void init();
     void exitStatus_data();
     void exitStatus();
+    void secondStartShowsTheFirst_data();
     void secondStartShowsTheFirst();
 
 private:
@@ -34,6 +36,9 @@ void TestStartup::init()
     dir = scratch.filePath(QStringLiteral("case %1 ключ").arg(++counter));
     QVERIFY(writeFile(dir + QLatin1String("/system/keyshortcutrc"), "[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\n"));
     QVERIFY(QDir().mkpath(dir + QLatin1String("/user")));
+    QVERIFY(QDir().mkpath(dir + QLatin1String("/run")));
+    QVERIFY(QFile::setPermissions(dir + QLatin1String("/run"),
+                                  QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
 }
 
 QProcessEnvironment TestStartup::environment() const
@@ -43,6 +48,7 @@ QProcessEnvironment TestStartup::environment() const
     env.insert(QStringLiteral("ZEM_USER_DIR"), dir + QLatin1String("/user"));
     env.insert(QStringLiteral("ZEM_SYSTEM_DIR"), dir + QLatin1String("/system"));
     env.insert(QStringLiteral("QT_QPA_PLATFORM"), QStringLiteral("xcb"));
+    env.insert(QStringLiteral("XDG_RUNTIME_DIR"), dir + QLatin1String("/run"));
     return env;
 }
 
@@ -68,8 +74,11 @@ void TestStartup::exitStatus_data()
     QTest::addColumn<int>("status");
     QTest::addColumn<QString>("said"); // part of what it prints
 
-    QTest::newRow("usage") << "" << QStringList{"-h", "x"} << "" << 1
-                           << "Usage: zem-admin-hotkeys filepath - open/create file as hotkeys coll\n\n";
+    QTest::newRow("usage, without a display too")
+        << "nodisplay" << QStringList{"-h", "x"} << "" << 1
+        << "Usage: zem-admin-hotkeys filepath - open/create file as hotkeys coll\n\n";
+    QTest::newRow("anything else without a display, in one line")
+        << "nodisplay" << QStringList() << "" << 5 << "zem-admin-hotkeys: cannot open the X display \"\"\n";
     QTest::newRow("a missing named file, not created")
         << "" << QStringList{"@/new.rc"} << "Warning Escape" << 2 << "";
     QTest::newRow("the user's file on a full disk: none is left behind")
@@ -109,7 +118,10 @@ void TestStartup::exitStatus()
             ::umount2(QFile::encodeName(userDir).constData(), MNT_DETACH);
     });
     QProcess editor;
-    editor.setProcessEnvironment(environment());
+    QProcessEnvironment env = environment();
+    if (setup == QLatin1String("nodisplay"))
+        env.remove(QStringLiteral("DISPLAY"));
+    editor.setProcessEnvironment(env);
     editor.start(QStringLiteral(ZEM_EDITOR_BINARY), arguments);
     for (const QString& step : box.split(QLatin1Char('|'), Qt::SkipEmptyParts))
         QVERIFY2(answer(step.section(QLatin1Char(' '), 0, 0), qPrintable(step.section(QLatin1Char(' '), 1))),
@@ -125,18 +137,49 @@ void TestStartup::exitStatus()
              QStringList());
 }
 
+void TestStartup::secondStartShowsTheFirst_data()
+{
+    QTest::addColumn<QString>("place"); // where lock and socket can go
+    QTest::newRow("the runtime directory") << "runtime";
+    QTest::newRow("no runtime directory, TMPDIR a file") << "tmpfile";
+    QTest::newRow("no runtime directory, TMPDIR too long for a socket") << "tmplong";
+    QTest::newRow("a lock that cannot be made: the editor starts all the same") << "planted";
+}
+
 void TestStartup::secondStartShowsTheFirst()
 {
+    QFETCH(QString, place);
+    QProcessEnvironment env = environment();
+    if (place != QLatin1String("runtime") && place != QLatin1String("planted"))
+        env.remove(QStringLiteral("XDG_RUNTIME_DIR"));
+    if (place == QLatin1String("tmpfile")) {
+        QVERIFY(writeFile(dir + QLatin1String("/tmpfile"), "x"));
+        env.insert(QStringLiteral("TMPDIR"), dir + QLatin1String("/tmpfile"));
+    } else if (place == QLatin1String("tmplong")) {
+        env.insert(QStringLiteral("TMPDIR"), dir + QLatin1Char('/') + QString(120, QLatin1Char('t')));
+        QVERIFY(QDir().mkpath(env.value(QStringLiteral("TMPDIR"))));
+    } else if (place == QLatin1String("planted")) {
+        const QByteArray id = qgetenv("DISPLAY") + "zem-admin-hotkeys";
+        const QString name =
+            QString::fromLatin1(QCryptographicHash::hash(id, QCryptographicHash::Sha1).toHex().left(16));
+        QVERIFY(
+            QDir().mkpath(dir + QLatin1String("/run/zem-admin-hotkeys-") + name + QLatin1String(".lock")));
+    }
     QProcess first;
-    first.setProcessEnvironment(environment());
+    first.setProcessEnvironment(env);
     first.start(QStringLiteral(ZEM_EDITOR_BINARY), QStringList());
-    QVERIFY(first.waitForStarted());
     // A missing user's file is created without a question.
     QVERIFY(answer(QStringLiteral("Zem hotkeys editor - keyshortcutrc"), "Tab"));
     QCOMPARE(readFile(dir + QLatin1String("/user/keyshortcutrc")), QByteArray("[ShortCutKeys]\n"));
+    if (place == QLatin1String("planted")) {
+        first.terminate();
+        QVERIFY(first.waitForFinished(5000));
+        QVERIFY(first.readAllStandardError().contains("cannot make the instance lock"));
+        return;
+    }
 
     QProcess second;
-    second.setProcessEnvironment(environment());
+    second.setProcessEnvironment(env);
     QElapsedTimer clock;
     clock.start();
     second.start(QStringLiteral(ZEM_EDITOR_BINARY), {QStringLiteral("--help")});

@@ -4,7 +4,6 @@
 #include "testenvironment.h"
 #include "zemmenudialog.h"
 
-#include <QLineEdit>
 #include <QToolButton>
 #include <QtTest>
 
@@ -19,8 +18,6 @@ private slots:
     void executableLoop_data();
     void executableLoop();
     void desktopEntries();
-    void execFieldCodes_data();
-    void execFieldCodes();
 
 private:
     QTemporaryDir scratch;
@@ -97,23 +94,6 @@ void TestDialogs::desktopEntries()
         shown << application.id + QLatin1Char('=') + application.name;
     QCOMPARE(shown, (QStringList{"dup.desktop=Home Duplicate", "editor.desktop=Text Editor",
                                  "vendor-tool.desktop=Vendor Tool"}));
-}
-
-void TestDialogs::execFieldCodes_data()
-{
-    QTest::addColumn<QString>("exec");
-    QTest::addColumn<QString>("command");
-    for (const auto& [exec, command] : {std::pair{"firefox %U", "firefox"},
-                                        {"a %f %F %u %U %i %c %k %d %D %n %N %v %m b", "a b"},
-                                        {"sh -c \"echo  100%%\" %f", "sh -c \"echo  100%\""}})
-        QTest::newRow(exec) << QString::fromLatin1(exec) << QString::fromLatin1(command);
-}
-
-void TestDialogs::execFieldCodes()
-{
-    QFETCH(QString, exec);
-    QFETCH(QString, command);
-    QCOMPARE(execWithoutFieldCodes(exec), command);
 }
 
 ZEM_TEST_MAIN(TestDialogs)

@@ -2,14 +2,12 @@
 // (it grabs the keyboard while recording).
 #include "kkeysequencewidget.h"
 #include "kkeysequencewidget_p.h"
-#include "modalanswerer.h"
 #include "testenvironment.h"
 
 #include <QAction>
 #include <QElapsedTimer>
 #include <QLineEdit>
 #include <QPushButton>
-#include <QToolButton>
 #include <QVBoxLayout>
 #include <QtTest>
 

@@ -51,6 +51,10 @@ private slots:
     void closeQuestion();
     void commandEntries();
     void saveAsAndRestore();
+    void applyRefused_data();
+    void applyRefused();
+    void changedOnDisk_data();
+    void changedOnDisk();
 
 private:
     QTreeWidgetItem* row(const QString& name, int index = 0) const;
@@ -73,8 +77,8 @@ void TestMainWindow::init()
 {
     const QString system =
         QString::fromLocal8Bit(qgetenv("ZEM_SYSTEM_DIR")) + QLatin1String("/keyshortcutrc");
+    QFile::remove(QString::fromLocal8Bit(qgetenv("ZEM_USER_DIR")));
     userFile = QString::fromLocal8Bit(qgetenv("ZEM_USER_DIR")) + QLatin1String("/keyshortcutrc");
-    QDir(userFile).removeRecursively();
     QVERIFY(writeFile(system, "[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\nCtrl|k=ZEMWM_KILL\n"));
     QVERIFY(writeFile(userFile, "[ShortCutKeys]\nAlt|F5=ZEMWM_LOCK\nCtrl|Alt|x=\"xclock\"\n"));
     form.reset(); // one main window at a time: its state is class-wide
@@ -213,8 +217,9 @@ void TestMainWindow::failedWriteKeepsEdits()
     QFETCH(QString, command);
     select(QStringLiteral("ZEMWM_EXIT"));
     form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
-    // The file's place is taken by a directory: the write fails, and says why.
-    QVERIFY(QFile::remove(userFile) && QDir().mkpath(userFile));
+    // The file's directory is replaced by a file: the write fails, and says why.
+    QVERIFY(QDir(QFileInfo(userFile).path()).removeRecursively() &&
+            writeFile(QFileInfo(userFile).path(), "x"));
 
     ModalAnswerer answerer({QMessageBox::Yes, QMessageBox::Ok});
     if (command == QLatin1String("save"))
@@ -224,7 +229,7 @@ void TestMainWindow::failedWriteKeepsEdits()
     else
         QVERIFY(!form->close());
     QCOMPARE(answerer.last().title, QStringLiteral("Error"));
-    QCOMPARE(answerer.last().text, QStringLiteral("Can't save in file %1\nIs a directory").arg(userFile));
+    QCOMPARE(answerer.last().text, QStringLiteral("Can't save in file %1\nNot a directory").arg(userFile));
     QVERIFY(KeysConfForm::isModified() && saveEnabled());
     QVERIFY(form->isVisible());
     QCOMPARE(takeRootProperty(), QByteArray());
@@ -292,19 +297,85 @@ void TestMainWindow::saveAsAndRestore()
     select(QStringLiteral("ZEMWM_EXIT"));
     form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
     const QString other = QFileInfo(userFile).path() + QLatin1String("/other.rc");
-    ModalAnswerer answerer({QMessageBox::Ok}, {other});
+    ModalAnswerer answerer({QMessageBox::Cancel, QMessageBox::Yes}, {other});
     form->fileSaveAs();
     // Another file holds every binding shown, the system's too, and is the one edited now.
     QCOMPARE(KeysConfForm::editedFile(), other);
     QCOMPARE(readFile(other),
              QByteArray("[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\nCtrl|k=ZEMWM_KILL\nAlt|F5=ZEMWM_LOCK\n"
                         "Ctrl|Alt|e=ZEMWM_EXIT\nCtrl|Alt|x=\"xclock\"\n"));
-    // Restore puts the system file in the place of the user's and edits that.
+    // Restore asks first; Cancel changes nothing. Yes puts the system file in the place of the
+    // user's, keeps the user's beside it, and edits it.
+    const QByteArray before = readFile(userFile);
+    form->fileRestore();
+    QCOMPARE(answerer.titles(), QStringList{"Restore"});
+    QCOMPARE(KeysConfForm::editedFile(), other);
     form->fileRestore();
     QCOMPARE(readFile(userFile),
              readFile(QFileInfo(userFile).path() + QLatin1String("/../system/keyshortcutrc")));
+    QCOMPARE(readFile(userFile + QLatin1Char('~')), before);
     QCOMPARE(KeysConfForm::editedFile(), userFile);
-    QCOMPARE(answerer.count(), 0);
+}
+
+void TestMainWindow::applyRefused_data()
+{
+    QTest::addColumn<QString>("fileName");
+    QTest::addColumn<QString>("text");
+    QTest::newRow("a line break in the file's name") << "keys\nZEMWM_UPDATE_VAL SCKeysFile evil.rc"
+                                                     << "The window manager cannot be told to use this file";
+    QTest::newRow("a property of another type in the way") << "keys.rc"
+                                                           << "The window manager could not be told";
+}
+
+void TestMainWindow::applyRefused()
+{
+    QFETCH(QString, fileName);
+    QFETCH(QString, text);
+    const QString path = QFileInfo(userFile).path() + QLatin1Char('/') + fileName;
+    QVERIFY(writeFile(path, "[ShortCutKeys]\n") && form->loadFile(path));
+    if (fileName == QLatin1String("keys.rc"))
+        QProcess::execute(QStringLiteral("xprop"),
+                          QStringLiteral("-root -f _ZEMWM_COMMAND 32i -set _ZEMWM_COMMAND 5").split(' '));
+    form->fileChanged();
+    ModalAnswerer answerer;
+    form->fileApply();
+    QCOMPARE(answerer.titles().last(), QStringLiteral("Error"));
+    QVERIFY2(answerer.last().text.startsWith(text), qPrintable(answerer.last().text));
+    QVERIFY(!takeRootProperty().contains("SCKeysFile"));
+}
+
+void TestMainWindow::changedOnDisk_data()
+{
+    QTest::addColumn<bool>("edited");
+    QTest::addColumn<QMessageBox::StandardButton>("answer"); // Save: Overwrite, Discard: Reload
+    QTest::addColumn<QString>("lockKey");                    // ZEMWM_LOCK's key afterwards
+    QTest::newRow("no unsaved edits: loaded at once, the row stays selected")
+        << false << QMessageBox::Ok << "Alt+F6";
+    QTest::newRow("Cancel keeps the edits and the file") << true << QMessageBox::Cancel << "Alt+F5";
+    QTest::newRow("Overwrite") << true << QMessageBox::Save << "Alt+F5";
+    QTest::newRow("Reload drops the edits") << true << QMessageBox::Discard << "Alt+F6";
+}
+
+void TestMainWindow::changedOnDisk()
+{
+    QFETCH(bool, edited);
+    QFETCH(QMessageBox::StandardButton, answer);
+    QFETCH(QString, lockKey);
+    if (edited) {
+        select(QStringLiteral("ZEMWM_EXIT"));
+        form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
+    }
+    select(QStringLiteral("ZEMWM_LOCK"));
+    const QByteArray theirs = "[ShortCutKeys]\nAlt|F6=ZEMWM_LOCK\n";
+    QVERIFY(writeFile(userFile, theirs));
+    ModalAnswerer answerer({answer});
+    if (edited)
+        form->fileSave();
+    QTRY_COMPARE(KeysConfForm::itemKey(row(QStringLiteral("ZEMWM_LOCK"))), lockKey);
+    QCOMPARE(form->findChild<QTreeWidget*>()->currentItem(), row(QStringLiteral("ZEMWM_LOCK")));
+    QCOMPARE(answerer.titles(), edited ? QStringList{"File changed on disk"} : QStringList());
+    QCOMPARE(readFile(userFile) == theirs, answer != QMessageBox::Save);
+    QCOMPARE(KeysConfForm::isModified(), answer == QMessageBox::Cancel);
 }
 
 ZEM_TEST_MAIN(TestMainWindow)
