@@ -1,5 +1,6 @@
 #include "bindingtree.h"
 
+#include "bindingfilter.h"
 #include "functioncatalogue.h"
 
 #include <QCoreApplication>
@@ -19,6 +20,7 @@ void BindingTree::rebuild()
     const QVector<WmFunctionEntry> table = buildWmFunctionTable();
 
     commandGroupRow = nullptr;
+    searchedCurrent = false;
     ids.clear();
     rows.clear();
     tree->clear();
@@ -65,6 +67,7 @@ QTreeWidgetItem* BindingTree::makeRow(const Binding& binding)
 
 void BindingTree::show(QTreeWidgetItem* row, const Binding& binding)
 {
+    searchedCurrent = false;
     if (binding.isCommand()) {
         row->setText(0, binding.command);
         row->setText(2, QStringLiteral("ExecCommand"));
@@ -127,7 +130,27 @@ QTreeWidgetItem* BindingTree::insert(BindingId id)
 
 void BindingTree::remove(BindingId id)
 {
+    searchedCurrent = false;
     QTreeWidgetItem* row = rows.take(id);
     ids.remove(row);
     delete row;
+}
+
+const QVector<BindingTree::SearchRow>& BindingTree::searchRows()
+{
+    if (searchedCurrent)
+        return searched;
+    searched.clear();
+    for (int g = 0; g < tree->topLevelItemCount(); ++g) {
+        const QTreeWidgetItem* group = tree->topLevelItem(g);
+        for (int i = 0; i < group->childCount(); ++i) {
+            QTreeWidgetItem* row = group->child(i);
+            // A command row's function column says only ExecCommand.
+            const QString function = group == commandGroupRow ? QString() : row->text(2);
+            searched.append({row, BindingFilter::searchText(row->text(0), function, row->text(1)),
+                             row->data(1, Qt::UserRole).toString()});
+        }
+    }
+    searchedCurrent = true;
+    return searched;
 }

@@ -38,6 +38,15 @@ public:
     // Deletes the row of a binding the model has just lost.
     void remove(BindingId id);
 
+    // Every binding row with what a filter looks at, made anew after the tree changed.
+    struct SearchRow
+    {
+        QTreeWidgetItem* row;
+        QString text;
+        QString key;
+    };
+    const QVector<SearchRow>& searchRows();
+
 private:
     QTreeWidgetItem* makeRow(const Binding& binding);
     void show(QTreeWidgetItem* row, const Binding& binding);
@@ -51,4 +60,6 @@ private:
     QVector<QString> functionTexts;
     QHash<const QTreeWidgetItem*, BindingId> ids;
     QHash<BindingId, QTreeWidgetItem*> rows;
+    QVector<SearchRow> searched;
+    bool searchedCurrent = false;
 };

@@ -54,6 +54,7 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags) : QMainWindow
     setCentralWidget(central);
     mainLayout = new QVBoxLayout(central);
 
+    createFilter(central);
     keysTree = new QTreeWidget(central);
     keysTree->setObjectName(QStringLiteral("keysTree"));
     keysTree->setSortingEnabled(false);

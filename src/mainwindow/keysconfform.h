@@ -14,6 +14,8 @@ class QAction;
 class QFileSystemWatcher;
 class QTimer;
 class QGroupBox;
+class QLabel;
+class QLineEdit;
 class QKeySequence;
 class QMenu;
 class QMenuBar;
@@ -95,16 +97,23 @@ public slots:
     virtual QTreeWidgetItem* setActionsEnabled(QTreeWidgetItem* item);
 
     bool messageReceived(const QString& message);
+    // Shows the rows the filter text matches; a row that stops matching through an edit stays
+    // until the text changes or a file is loaded.
+    void applyFilter();
     // The desktop session ends: unsaved edits are offered for saving as when the window closes,
     // and Cancel keeps the session from ending.
     void commitData(QSessionManager& manager);
 
 protected:
+    bool eventFilter(QObject* watched, QEvent* event) override;
     void closeEvent(QCloseEvent* event) override;
     void contextMenuEvent(QContextMenuEvent* event) override;
 
 private:
     void showHeaderMenu(const QPoint& position);
+    void createFilter(QWidget* parent);
+    void findKey(const QKeySequence& seq);
+    void resetFindKey();
     // Loads currentFile; when it cannot be loaded, says so and makes previous current again.
     bool loadCurrentFileOr(const QString& previous);
     bool saveFileOrWarn();
@@ -153,6 +162,12 @@ private:
     QString failedPath;
     QString loadError;
     QString saveError;
+    QLineEdit* filterEdit = nullptr;
+    KKeySequenceWidget* findKeyWidget = nullptr;
+    QLabel* filterStatus = nullptr;
+    QTimer* filterTimer = nullptr;
+    QList<bool> expandedBeforeFilter;
+    bool wasFiltering = false;
     QFileSystemWatcher* watcher = nullptr;
     QTimer* changeTimer = nullptr;
     QString watchedFile;

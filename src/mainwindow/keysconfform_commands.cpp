@@ -15,6 +15,8 @@ void KeysConfForm::newCommand()
         return;
 
     QTreeWidgetItem* row = bindingTree->insert(model.addCommand(dialog.command()));
+    // Shown even where a filter hid every other command.
+    commandGroupItem->setHidden(false);
     keysTree->scrollToItem(row);
     keysTree->setCurrentItem(row);
     keyGroupBox->setEnabled(true);

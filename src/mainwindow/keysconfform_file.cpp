@@ -125,6 +125,8 @@ bool KeysConfForm::loadFile(const QString& path)
     keysTree->setUpdatesEnabled(false);
     fillFunctionTree();
     keysTree->setUpdatesEnabled(true);
+    // A new tree shows what the filter asks for.
+    applyFilter();
     modified = false;
     fileSaveAction->setEnabled(false);
     fileApplyAction->setEnabled(false);

@@ -1,6 +1,7 @@
 // The hotkeys file on disk: key forms, what is refused before it is read, and writes that leave
 // the old file whole when the disk fails them. (The line model is held against the INI reader
 // by the reader fuzz target, whose seeds hold the odd cases.)
+#include "bindingfilter.h"
 #include "hotkeysfile.h"
 #include "zemcore.h"
 
@@ -38,6 +39,8 @@ private slots:
     void locations();
     void keyForms_data();
     void keyForms();
+    void filter_data();
+    void filter();
     void refused_data();
     void refused();
     void failedWriteKeepsFile();
@@ -102,6 +105,49 @@ void TestHotkeysFile::keyForms()
         QCOMPARE(fromFileKey(file), stored);
     else
         QCOMPARE(fromFileKey(file), QString());
+}
+
+void TestHotkeysFile::filter_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<QString>("shown"); // which of the three rows below it shows
+
+    QTest::newRow("action, any case") << "CLOSE a"
+                                      << "1";
+    QTest::newRow("function name") << "zemwm_res"
+                                   << "3";
+    QTest::newRow("command line") << "xterm -e"
+                                  << "2";
+    QTest::newRow("key as shown") << "alt+t"
+                                  << "1";
+    QTest::newRow("modifiers in another order") << "alt+ctrl+t"
+                                                << "1";
+    QTest::newRow("file form") << "Ctrl|Alt|t"
+                               << "1";
+    QTest::newRow("file form without modifier") << "None|F5"
+                                                << "3";
+    QTest::newRow("Super and Win are Meta") << "win+d"
+                                            << "2";
+    QTest::newRow("ExecCommand names no command") << "ExecCommand"
+                                                  << "";
+    QTest::newRow("empty shows all") << "  "
+                                     << "123";
+}
+
+void TestHotkeysFile::filter()
+{
+    QFETCH(QString, text);
+    QFETCH(QString, shown);
+    const BindingFilter filter(text);
+    QString matched;
+    if (filter.matches(BindingFilter::searchText("close a window", "ZEMWM_CLOSE", "Ctrl+Alt+T"),
+                       "Ctrl+Alt+T"))
+        matched += '1';
+    if (filter.matches(BindingFilter::searchText("xterm -e top", QString(), "Meta+D"), "Meta+D"))
+        matched += '2';
+    if (filter.matches(BindingFilter::searchText("restart", "ZEMWM_RESTART", "F5"), "F5"))
+        matched += '3';
+    QCOMPARE(matched, shown);
 }
 
 void TestHotkeysFile::refused_data()

@@ -8,9 +8,11 @@
 
 #include <QAction>
 #include <QGroupBox>
+#include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QStatusBar>
 #include <QTreeWidget>
 #include <QTreeWidgetItemIterator>
 #include <QtTest>
@@ -55,6 +57,7 @@ private slots:
     void applyRefused();
     void changedOnDisk_data();
     void changedOnDisk();
+    void filterAndFindKey();
 
 private:
     QTreeWidgetItem* row(const QString& name, int index = 0) const;
@@ -63,7 +66,7 @@ private:
         form->findChild<QTreeWidget*>()->setCurrentItem(row(name, index));
     }
     QAction* action(const char* name) const { return form->findChild<QAction*>(QLatin1String(name)); }
-    KKeySequenceWidget* keyWidget() const { return form->findChild<KKeySequenceWidget*>(); }
+    KKeySequenceWidget* keyWidget() const { return form->findChild<KKeySequenceWidget*>("keyWidget"); }
     bool saveEnabled() const
     {
         return action("fileSaveAction")->isEnabled() && action("fileApplyAction")->isEnabled();
@@ -144,7 +147,7 @@ void TestMainWindow::selectionShowsTheRow()
     QCOMPARE(form->findChild<QGroupBox*>("keyGroupBox")->isEnabled(), !panel.isEmpty());
     if (!panel.isEmpty()) {
         QCOMPARE(form->findChild<QRadioButton*>("customKeyRadio")->isChecked(), panel.startsWith("assign"));
-        QCOMPARE(form->findChild<QPushButton*>("recordButton")->text(),
+        QCOMPARE(keyWidget()->findChild<QPushButton*>("recordButton")->text(),
                  QLatin1Char(' ') + panel.section(' ', 1) + ' ');
     }
     QVERIFY(!KeysConfForm::isModified());
@@ -376,6 +379,29 @@ void TestMainWindow::changedOnDisk()
     QCOMPARE(answerer.titles(), edited ? QStringList{"File changed on disk"} : QStringList());
     QCOMPARE(readFile(userFile) == theirs, answer != QMessageBox::Save);
     QCOMPARE(KeysConfForm::isModified(), answer == QMessageBox::Cancel);
+}
+
+void TestMainWindow::filterAndFindKey()
+{
+    auto* filter = form->findChild<QLineEdit*>(QStringLiteral("filterEdit"));
+    QTreeWidgetItem* lockGroup = row(QStringLiteral("ZEMWM_LOCK"))->parent();
+    lockGroup->setExpanded(true);
+    form->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(form.get()));
+    QTest::keyClick(form.get(), Qt::Key_F, Qt::ControlModifier);
+    QTRY_VERIFY(filter->hasFocus());
+    QTest::keyClicks(filter, QStringLiteral("xclock"));
+    QTRY_COMPARE(form->statusBar()->findChild<QLabel*>()->text(), QStringLiteral("1 of 155 bindings"));
+    QVERIFY(row(QStringLiteral("cmd:xclock"))->parent()->isExpanded() && lockGroup->isHidden());
+    // Escape empties the filter, and the groups are open as they were before.
+    QTest::keyClick(filter, Qt::Key_Escape);
+    QTRY_VERIFY(!lockGroup->isHidden() && lockGroup->isExpanded());
+    QVERIFY(!KeysConfForm::commandGroup()->isExpanded());
+
+    form->findChild<KKeySequenceWidget*>(QStringLiteral("findKeyWidget"))
+        ->setKeySequence(QKeySequence(QStringLiteral("Ctrl+Alt+Y")), KKeySequenceWidget::NoValidate);
+    QCOMPARE(filter->text(), QStringLiteral("Ctrl+Alt+Y"));
+    QCOMPARE(form->statusBar()->currentMessage(), QStringLiteral("Ctrl+Alt+Y is free"));
 }
 
 ZEM_TEST_MAIN(TestMainWindow)

@@ -1,0 +1,28 @@
+#pragma once
+
+#include <QString>
+
+// Reads a key combination the way a user may type it: the shown form with the modifiers in any
+// order ("alt+ctrl+t"), the file form ("Ctrl|Alt|t", "None|F5"), X key names ("space",
+// "XF86AudioMute"), and "Super" or "Win" for Meta. Gives QKeySequence portable text, or an
+// empty string when the text is no key combination.
+QString keyFromUserText(const QString& text);
+
+// Which binding rows a filter text shows: those whose action, function name, command or shown
+// key holds the text, ignoring case, and those whose key is the combination the text reads as.
+class BindingFilter
+{
+public:
+    explicit BindingFilter(const QString& text = QString());
+
+    bool isEmpty() const { return text.isEmpty(); }
+    // What of a row the text is looked for in, made once per row: its action (the command line
+    // of a command row), its function name (empty for a command row) and its key as shown.
+    static QString searchText(const QString& action, const QString& function, const QString& shownKey);
+    // `key` is the row's stored key (portable text).
+    bool matches(const QString& searchText, const QString& key) const;
+
+private:
+    QString text;
+    QString key;
+};
