@@ -197,6 +197,15 @@ bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBy
         for (const HotkeysEntry& entry : document.entries()) {
             const QString key = fromFileKey(QString::fromLocal8Bit(entry.key));
             const QString value = unquoted(QString::fromLocal8Bit(entry.value));
+            if (!edited && !key.isEmpty() && value != disableValue) {
+                // Kept whether or not the user's file hides it: freeing the key brings it back.
+                fresh.systemKeys.insert(key.toLower());
+                const int function = functionIndex().value(value, -1);
+                if (function >= 0)
+                    fresh.systemBindings[function].append(
+                        Binding{0, function, QString(), key, source,
+                                originOf(systemLines, systemLastLine, entry, key, value, false)});
+            }
             // Whoever bound the key first keeps it: the user's file before the system one.
             if (!key.isEmpty() && boundKeys.contains(key.toLower()))
                 continue;
@@ -322,12 +331,21 @@ BindingId HotkeysModel::holderOf(const QString& key, BindingId except) const
     return 0;
 }
 
-void HotkeysModel::disableKeyOf(const Binding& row)
+void HotkeysModel::keepFreedKeyOff(const Binding& row)
 {
-    // A system binding stays switched off once the user's file is saved. A row without a key
-    // binds nothing.
-    if (row.source == BindingSource::System && !row.key.isEmpty() && !isDisabled(row.key))
+    if (row.key.isEmpty() || isDisabled(row.key) || holderOf(row.key, row.id))
+        return;
+    // Otherwise the system file's binding of the key would answer to it again after saving.
+    if (row.source == BindingSource::System || systemKeys.contains(row.key.toLower()))
         disabled.append({row.key, row.origin});
+}
+
+void HotkeysModel::enable(const QString& key)
+{
+    // A combination in use again is no longer disabled.
+    disabled.erase(
+        std::remove_if(disabled.begin(), disabled.end(), [&](const DisabledKey& d) { return d.key == key; }),
+        disabled.end());
 }
 
 void HotkeysModel::setKey(BindingId id, const QString& key)
@@ -335,12 +353,12 @@ void HotkeysModel::setKey(BindingId id, const QString& key)
     Binding* row = findMutable(id);
     if (!row)
         return;
+    const Binding before = *row;
     row->key = key;
     row->source = BindingSource::User;
-    // A combination in use again is no longer disabled.
-    disabled.erase(
-        std::remove_if(disabled.begin(), disabled.end(), [&](const DisabledKey& d) { return d.key == key; }),
-        disabled.end());
+    enable(key);
+    if (before.key != key)
+        keepFreedKeyOff(before);
 }
 
 void HotkeysModel::clearKey(BindingId id)
@@ -348,9 +366,75 @@ void HotkeysModel::clearKey(BindingId id)
     Binding* row = findMutable(id);
     if (!row)
         return;
-    disableKeyOf(*row);
+    keepFreedKeyOff(*row);
     row->key.clear();
     row->source = BindingSource::User;
+}
+
+void HotkeysModel::reassign(BindingId holder, BindingId target)
+{
+    Binding* from = findMutable(holder);
+    if (!from || !findMutable(target))
+        return;
+    const QString key = from->key;
+    // The key stays in use, so nothing is to be switched off for it.
+    from->key.clear();
+    from->source = BindingSource::User;
+    setKey(target, key);
+}
+
+QVector<Binding> HotkeysModel::systemRowsOf(int function) const
+{
+    const QVector<Binding> read = systemBindings.value(function);
+    QVector<Binding> rows;
+    for (const Binding& binding : read) {
+        const Binding* holder = find(holderOf(binding.key));
+        if (!holder || holder->function == function)
+            rows.append(binding);
+    }
+    // As loading arranges them: the first read first, the others after it, the last read nearest.
+    if (rows.size() > 2)
+        std::reverse(rows.begin() + 1, rows.end());
+    return rows;
+}
+
+bool HotkeysModel::differsFromSystem(int function) const
+{
+    const QVector<Binding> expected = systemRowsOf(function);
+    const QVector<Binding>& rows = functionRows.at(function);
+    if (expected.isEmpty())
+        return rows.size() != 1 || !rows.first().key.isEmpty();
+    if (rows.size() != expected.size())
+        return true;
+    for (int i = 0; i < rows.size(); ++i) {
+        if (rows.at(i).source != BindingSource::System || rows.at(i).key != expected.at(i).key)
+            return true;
+    }
+    return false;
+}
+
+QStringList HotkeysModel::revertToSystem(int function)
+{
+    QVector<Binding>& rows = functionRows[function];
+    const QVector<Binding> old = rows;
+    rows.clear();
+    for (const Binding& row : old)
+        keepFreedKeyOff(row);
+    QStringList heldElsewhere;
+    for (const Binding& binding : systemBindings.value(function)) {
+        if (holderOf(binding.key)) {
+            heldElsewhere << binding.key;
+            continue;
+        }
+        rows.append(
+            Binding{++lastId, function, QString(), binding.key, BindingSource::System, binding.origin});
+        enable(binding.key);
+    }
+    if (rows.size() > 2)
+        std::reverse(rows.begin() + 1, rows.end());
+    if (rows.isEmpty())
+        rows.append(Binding{++lastId, function, QString(), QString(), BindingSource::Unset, nullptr});
+    return heldElsewhere;
 }
 
 void HotkeysModel::setCommand(BindingId id, const QString& command)
@@ -395,7 +479,7 @@ bool HotkeysModel::removeRow(BindingId id)
     QVector<Binding>& rows = row->isCommand() ? commandRows : functionRows[row->function];
     if (!row->isCommand() && rows.size() < 2)
         return false;
-    disableKeyOf(*row);
+    keepFreedKeyOff(*row);
     rows.erase(std::find_if(rows.begin(), rows.end(), [&](const Binding& b) { return b.id == id; }));
     return true;
 }

@@ -1,6 +1,8 @@
 #pragma once
 
 #include <QByteArray>
+#include <QHash>
+#include <QSet>
 #include <QString>
 #include <QStringList>
 #include <QVector>
@@ -80,6 +82,9 @@ public:
     // the same stored key in any letter case; 0 when none. `except` is passed over.
     BindingId holderOf(const QString& key, BindingId except = 0) const;
 
+    // Every edit keeps what the window shows equal to what is saved: a key freed from a system
+    // binding, or from a user binding that hid the system file's binding of it, is switched
+    // off, unless another row holds it.
     void setKey(BindingId id, const QString& key);
     void clearKey(BindingId id);
     void setCommand(BindingId id, const QString& command);
@@ -88,6 +93,13 @@ public:
     BindingId cloneRow(BindingId id);
     // False for a function's last row, which always stays.
     bool removeRow(BindingId id);
+    // The key moves from the row that holds it, which is left without one, to the target row.
+    void reassign(BindingId holder, BindingId target);
+    // Whether the function's rows are other than those the system file gives it.
+    bool differsFromSystem(int function) const;
+    // Makes the function's rows those the system file gives it, their keys no longer disabled;
+    // gives back the system keys that other rows hold, which stay with them.
+    QStringList revertToSystem(int function);
 
     // The file's bytes: the rows in order (only the user's when userFile), the disabled keys,
     // then what was read but not shown; around them the rest of the file as it was read.
@@ -103,7 +115,11 @@ private:
     };
 
     Binding* findMutable(BindingId id);
-    void disableKeyOf(const Binding& row);
+    void keepFreedKeyOff(const Binding& row);
+    void enable(const QString& key);
+    // The system file's rows of the function, as loading arranges them, less the keys that rows
+    // of other functions hold.
+    QVector<Binding> systemRowsOf(int function) const;
     QByteArray writtenKey(const QString& key, const EntryOrigin* origin) const;
     void assignPlaceholders(bool userFile);
 
@@ -111,6 +127,9 @@ private:
     QVector<Binding> commandRows;
     QVector<DisabledKey> disabled;
     QVector<Kept> kept;
+    // What the system file binds: each function's keys in the order read, and every key.
+    QHash<int, QVector<Binding>> systemBindings;
+    QSet<QString> systemKeys;
     // The edited file around its entries: before the section, the section's header, what
     // closes the section, the other sections, and what follows the last line.
     QByteArray beforeSection;

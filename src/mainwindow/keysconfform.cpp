@@ -1,7 +1,9 @@
 #include "keysconfform.h"
 
 #include "bindingtree.h"
+#include "hotkeysfile.h"
 #include "kkeysequencewidget.h"
+#include "modelcommand.h"
 #include "zemhelpmenu.h"
 
 #include <QAction>
@@ -22,6 +24,7 @@
 #include <QToolBar>
 #include <QTreeWidget>
 #include <QTreeWidgetItemIterator>
+#include <QUndoStack>
 #include <QVBoxLayout>
 
 QString KeysConfForm::userSource;
@@ -129,6 +132,23 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags) : QMainWindow
     fileMenu->addSeparator();
     fileMenu->addAction(fileExitAction);
     menuBar->addMenu(fileMenu);
+    // Every edit is a step that can be taken back.
+    undoStack = new QUndoStack(this);
+    QAction* undoAction = undoStack->createUndoAction(this, tr("Undo"));
+    undoAction->setObjectName(QStringLiteral("undoAction"));
+    undoAction->setShortcut(QKeySequence::Undo);
+    QAction* redoAction = undoStack->createRedoAction(this, tr("Redo"));
+    redoAction->setObjectName(QStringLiteral("redoAction"));
+    redoAction->setShortcut(QKeySequence::Redo);
+    revertAction = makeAction(this, tr("Revert to System Binding"), "edit-undo");
+    revertAction->setObjectName(QStringLiteral("revertAction"));
+    revertAction->setEnabled(false);
+    QMenu* editMenu = new QMenu(tr("&Edit"), menuBar);
+    editMenu->addAction(undoAction);
+    editMenu->addAction(redoAction);
+    editMenu->addSeparator();
+    editMenu->addAction(revertAction);
+    menuBar->addMenu(editMenu);
     menuBar->addMenu(new ZemHelpMenu(this));
     setMenuWidget(menuBar);
 
@@ -164,6 +184,8 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags) : QMainWindow
     connect(newCommandAction, &QAction::triggered, this, &KeysConfForm::newCommand);
     connect(fileApplyAction, &QAction::triggered, this, &KeysConfForm::fileApply);
     connect(cloneCommandAction, &QAction::triggered, this, &KeysConfForm::cloneCommand);
+    connect(revertAction, &QAction::triggered, this, &KeysConfForm::revertToSystemBinding);
+    connect(undoStack, &QUndoStack::indexChanged, this, &KeysConfForm::fileChanged);
 
     // Changes on disk come in bursts (a write, a rename); they are gathered for a moment.
     watcher = new QFileSystemWatcher(this);
@@ -177,6 +199,8 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags) : QMainWindow
 
 KeysConfForm::~KeysConfForm()
 {
+    // The stack says it is emptied as it goes, when this window is no longer one.
+    undoStack->disconnect(this);
     saveWindowState();
     // The class-wide pointers must not outlive the rows and menus they point into.
     commandGroupItem = nullptr;
@@ -208,6 +232,7 @@ bool KeysConfForm::init(QString filepath)
     popupMenu->addAction(cloneCommandAction);
     popupMenu->addAction(editCommandAction);
     popupMenu->addAction(deleteCommandAction);
+    popupMenu->addAction(revertAction);
     setActionsEnabled(nullptr);
 
     const bool loaded = loadFile(filepath);
@@ -271,6 +296,41 @@ void KeysConfForm::itemSelectionChanged()
     QTreeWidgetItem* row = selected.isEmpty() ? nullptr : selected.first();
     itemSelected(row);
     setActionsEnabled(row);
+    updateRevertAction();
+}
+
+void KeysConfForm::updateRevertAction()
+{
+    const Binding* binding = model.find(bindingAt(targetRow()));
+    revertAction->setEnabled(binding && !binding->isCommand() && currentFile == userHotkeysFilePath() &&
+                             model.differsFromSystem(binding->function));
+}
+
+void KeysConfForm::recordEdit(const QString& text, const HotkeysModel& before, BindingId focus)
+{
+    undoStack->push(new ModelCommand(this, text, before, model, focus));
+    fileChanged();
+}
+
+void KeysConfForm::showBindings(const HotkeysModel& state, BindingId focus)
+{
+    model = state;
+    QList<bool> expanded;
+    for (int g = 0; g < keysTree->topLevelItemCount(); ++g)
+        expanded << keysTree->topLevelItem(g)->isExpanded();
+    keysTree->setUpdatesEnabled(false);
+    fillFunctionTree();
+    for (int g = 0; g < keysTree->topLevelItemCount(); ++g)
+        keysTree->topLevelItem(g)->setExpanded(expanded.value(g));
+    keysTree->setUpdatesEnabled(true);
+    applyFilter();
+    // The row the step was about, where it still is.
+    if (QTreeWidgetItem* row = bindingTree->rowOf(focus)) {
+        row->setHidden(false);
+        row->parent()->setHidden(false);
+        keysTree->scrollToItem(row);
+        keysTree->setCurrentItem(row);
+    }
 }
 
 QTreeWidgetItem* KeysConfForm::setActionsEnabled(QTreeWidgetItem* item)

@@ -25,6 +25,7 @@ class QSessionManager;
 class QToolBar;
 class QTreeWidget;
 class QTreeWidgetItem;
+class QUndoStack;
 class QVBoxLayout;
 
 // The editor's main window: the tree of window-manager functions and command entries with
@@ -95,8 +96,12 @@ public slots:
     virtual void setKey(const QKeySequence& seq);
     virtual void slotPopupMenu(QTreeWidgetItem* item, QPoint point, int);
     virtual QTreeWidgetItem* setActionsEnabled(QTreeWidgetItem* item);
+    // The function row's rows become those the system file gives it, as one undoable step.
+    void revertToSystemBinding();
 
     bool messageReceived(const QString& message);
+    // Shows these bindings, as undo and redo do, with the row they were about made current.
+    void showBindings(const HotkeysModel& state, BindingId focus);
     // Shows the rows the filter text matches; a row that stops matching through an edit stays
     // until the text changes or a file is loaded.
     void applyFilter();
@@ -111,6 +116,11 @@ protected:
 
 private:
     void showHeaderMenu(const QPoint& position);
+    // An edit already done on the model becomes one step of the undo stack.
+    void recordEdit(const QString& text, const HotkeysModel& before, BindingId focus);
+    // After New, Open and Restore: nothing to undo, and the file counts as edited.
+    void startAfresh();
+    void updateRevertAction();
     void createFilter(QWidget* parent);
     void findKey(const QKeySequence& seq);
     void resetFindKey();
@@ -162,6 +172,9 @@ private:
     QString failedPath;
     QString loadError;
     QString saveError;
+    QUndoStack* undoStack = nullptr;
+    QAction* revertAction = nullptr;
+    bool reassignChosen = false;
     QLineEdit* filterEdit = nullptr;
     KKeySequenceWidget* findKeyWidget = nullptr;
     QLabel* filterStatus = nullptr;

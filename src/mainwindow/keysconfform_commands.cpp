@@ -1,9 +1,11 @@
 #include "keysconfform.h"
 
 #include "bindingtree.h"
+#include "hotkeysfile.h"
 #include "selectcommanddialog.h"
 
 #include <QGroupBox>
+#include <QKeySequence>
 #include <QMessageBox>
 #include <QTreeWidget>
 
@@ -14,13 +16,15 @@ void KeysConfForm::newCommand()
     if (dialog.exec() != QDialog::Accepted || dialog.command().isEmpty())
         return;
 
-    QTreeWidgetItem* row = bindingTree->insert(model.addCommand(dialog.command()));
+    const HotkeysModel before = model;
+    const BindingId id = model.addCommand(dialog.command());
+    QTreeWidgetItem* row = bindingTree->insert(id);
     // Shown even where a filter hid every other command.
     commandGroupItem->setHidden(false);
     keysTree->scrollToItem(row);
     keysTree->setCurrentItem(row);
     keyGroupBox->setEnabled(true);
-    fileChanged();
+    recordEdit(tr("Add command %1").arg(dialog.command()), before, id);
 }
 
 void KeysConfForm::editCommand()
@@ -40,9 +44,10 @@ void KeysConfForm::itemDoubleClicked(QTreeWidgetItem* clicked, int)
     if (dialog.exec() != QDialog::Accepted || dialog.command().isEmpty() ||
         dialog.command() == clicked->text(0))
         return;
+    const HotkeysModel before = model;
     model.setCommand(bindingAt(clicked), dialog.command());
     bindingTree->refresh(bindingAt(clicked));
-    fileChanged();
+    recordEdit(tr("Edit command %1").arg(dialog.command()), before, bindingAt(clicked));
 }
 
 void KeysConfForm::cloneCommand()
@@ -50,13 +55,15 @@ void KeysConfForm::cloneCommand()
     QTreeWidgetItem* target = targetRow();
     if (!target || !target->parent())
         return;
-    QTreeWidgetItem* row = bindingTree->insert(model.cloneRow(bindingAt(target)));
+    const HotkeysModel before = model;
+    const BindingId id = model.cloneRow(bindingAt(target));
+    QTreeWidgetItem* row = bindingTree->insert(id);
     if (!row)
         return;
     keysTree->scrollToItem(row);
     keysTree->setCurrentItem(row);
     keyGroupBox->setEnabled(true);
-    fileChanged();
+    recordEdit(tr("Clone %1").arg(target->text(0)), before, id);
 }
 
 void KeysConfForm::deleteCommand()
@@ -69,11 +76,37 @@ void KeysConfForm::deleteCommand()
                               QMessageBox::Yes | QMessageBox::No, QMessageBox::No) != QMessageBox::Yes)
         return;
 
+    const HotkeysModel before = model;
     const BindingId id = bindingAt(target);
+    const QString text = target->text(0);
     if (!model.removeRow(id))
         return;
     bindingTree->remove(id);
     keysTree->setCurrentItem(parent);
     parent->setSelected(true);
-    fileChanged();
+    recordEdit(tr("Delete %1").arg(text), before, id);
+}
+
+void KeysConfForm::revertToSystemBinding()
+{
+    const BindingId id = bindingAt(targetRow());
+    const Binding* binding = model.find(id);
+    if (!binding || binding->isCommand() || currentFile != userHotkeysFilePath())
+        return;
+    const HotkeysModel before = model;
+    const QString text = targetRow()->text(0);
+    const QStringList heldElsewhere = model.revertToSystem(binding->function);
+    const BindingId first = model.rowsOf(before.find(id)->function).first().id;
+    showBindings(model, first);
+    recordEdit(tr("Revert %1 to the system binding").arg(text), before, first);
+    if (!heldElsewhere.isEmpty()) {
+        QStringList shown;
+        for (const QString& key : heldElsewhere)
+            shown << QKeySequence::fromString(key, QKeySequence::PortableText)
+                         .toString(QKeySequence::NativeText);
+        QMessageBox::information(this, tr("Revert to System Binding"),
+                                 tr("%1 stays with the row that holds it now.", nullptr, shown.size())
+                                     .arg(shown.join(QLatin1String(", "))),
+                                 QMessageBox::Ok);
+    }
 }

@@ -11,6 +11,7 @@
 #include <QFileInfo>
 #include <QMessageBox>
 #include <QTreeWidget>
+#include <QUndoStack>
 #include <QX11Info>
 
 #include <algorithm>
@@ -28,9 +29,19 @@ void KeysConfForm::updateTitle()
 
 void KeysConfForm::fileChanged()
 {
-    modified = true;
-    fileSaveAction->setEnabled(true);
-    fileApplyAction->setEnabled(true);
+    // Unsaved edits are the steps between the clean state of the undo stack and now.
+    modified = !undoStack->isClean();
+    fileSaveAction->setEnabled(modified);
+    fileApplyAction->setEnabled(modified);
+    updateRevertAction();
+}
+
+void KeysConfForm::startAfresh()
+{
+    // The file as it now stands counts as edited: Save rewrites it and Apply hands it over.
+    undoStack->clear();
+    undoStack->resetClean();
+    fileChanged();
 }
 
 QMessageBox::StandardButton KeysConfForm::askSaveChanges()
@@ -127,9 +138,9 @@ bool KeysConfForm::loadFile(const QString& path)
     keysTree->setUpdatesEnabled(true);
     // A new tree shows what the filter asks for.
     applyFilter();
-    modified = false;
-    fileSaveAction->setEnabled(false);
-    fileApplyAction->setEnabled(false);
+    // A loaded file has nothing to undo and no unsaved edits.
+    undoStack->clear();
+    fileChanged();
     watchFiles();
     return true;
 }
@@ -169,7 +180,7 @@ void KeysConfForm::fileNew()
     if (!selectFile(false))
         return;
     copyToCurrentFile(previous);
-    fileChanged();
+    startAfresh();
 }
 
 void KeysConfForm::fileOpen()
@@ -180,7 +191,7 @@ void KeysConfForm::fileOpen()
     if (!selectFile(true))
         return;
     if (loadCurrentFileOr(previous))
-        fileChanged();
+        startAfresh();
 }
 
 bool KeysConfForm::loadCurrentFileOr(const QString& previous)
@@ -211,8 +222,10 @@ bool KeysConfForm::saveFileOrWarn()
 void KeysConfForm::fileSave()
 {
     // A failed save keeps the edits marked unsaved, so that they are still offered for saving.
-    if (saveFileOrWarn())
-        modified = false;
+    if (saveFileOrWarn()) {
+        undoStack->setClean();
+        fileChanged();
+    }
 }
 
 void KeysConfForm::fileSaveAs()
@@ -246,7 +259,7 @@ void KeysConfForm::fileRestore()
     }
     copyToCurrentFile(systemHotkeysFilePath());
     if (loadCurrentFileOr(previous))
-        fileChanged();
+        startAfresh();
 }
 
 void KeysConfForm::fileApply()
@@ -265,9 +278,8 @@ void KeysConfForm::fileApply()
     // Nothing is handed to the window manager that was not written.
     if (!saveFileOrWarn())
         return;
-    modified = false;
-    fileSaveAction->setEnabled(false);
-    fileApplyAction->setEnabled(false);
+    undoStack->setClean();
+    fileChanged();
 
     if (currentFile != startupFile) {
         QMessageBox::warning(this, tr("Warning"),

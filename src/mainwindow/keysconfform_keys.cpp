@@ -6,6 +6,7 @@
 #include <QGroupBox>
 #include <QKeySequence>
 #include <QMessageBox>
+#include <QPushButton>
 #include <QRadioButton>
 #include <QTreeWidget>
 
@@ -63,13 +64,31 @@ void KeysConfForm::setKey(const QKeySequence& seq)
     const BindingId id = bindingAt(keysTree->currentItem());
     if (!id || seq.isEmpty())
         return;
-    if (isKeyPresent(seq, true))
+    const HotkeysModel before = model;
+    const QString key = seq.toString(QKeySequence::PortableText);
+    if (isKeyPresent(seq, true)) {
+        if (!reassignChosen)
+            return;
+        // The key moves here; the row that held it is left without one.
+        const BindingId holder = model.holderOf(key, id);
+        const QString holderText = bindingTree->rowOf(holder)->text(0);
+        model.reassign(holder, id);
+        bindingTree->refresh(holder);
+        bindingTree->refresh(id);
+        keyWidget->setKeySequence(seq, KKeySequenceWidget::NoValidate);
+        recordEdit(
+            tr("Reassign %1 from %2 to %3")
+                .arg(seq.toString(QKeySequence::NativeText), holderText, keysTree->currentItem()->text(0)),
+            before, id);
         return;
+    }
 
-    model.setKey(id, seq.toString(QKeySequence::PortableText));
+    model.setKey(id, key);
     bindingTree->refresh(id);
     keyWidget->setKeySequence(seq, KKeySequenceWidget::NoValidate);
-    fileChanged();
+    recordEdit(
+        tr("Assign %1 to %2").arg(seq.toString(QKeySequence::NativeText), keysTree->currentItem()->text(0)),
+        before, id);
 }
 
 bool KeysConfForm::isKeyPresent(const QKeySequence& seq, bool warnuser)
@@ -80,6 +99,7 @@ bool KeysConfForm::isKeyPresent(const QKeySequence& seq, bool warnuser)
     const BindingId holderId =
         model.holderOf(seq.toString(QKeySequence::PortableText), bindingAt(keysTree->currentItem()));
     QTreeWidgetItem* holder = bindingTree->rowOf(holderId);
+    reassignChosen = false;
     if (!holder)
         return false;
 
@@ -88,11 +108,16 @@ bool KeysConfForm::isKeyPresent(const QKeySequence& seq, bool warnuser)
         const QString function = holder->text(2);
         //: Names a command entry in "to the %2 action (%3)", where %3 is its command line.
         const QString holderName = function == QLatin1String("ExecCommand") ? tr("command") : function;
-        QMessageBox::warning(this, tr("Whoopsie! Key conflict."),
-                             tr("Ouch! The %1 key combination has already been allocated\nto the %2 action "
-                                "(%3).\n\nPlease choose a unique key combination.")
-                                 .arg(seq.toString(QKeySequence::NativeText), holderName, holder->text(0)),
-                             QMessageBox::Ok);
+        QMessageBox box(QMessageBox::Warning, tr("Whoopsie! Key conflict."),
+                        tr("Ouch! The %1 key combination has already been allocated\nto the %2 action "
+                           "(%3).\n\nPlease choose a unique key combination.")
+                            .arg(seq.toString(QKeySequence::NativeText), holderName, holder->text(0)),
+                        QMessageBox::Ok | QMessageBox::Apply, this);
+        //: Moves the key combination to the edited row, leaving the other one without a key.
+        box.button(QMessageBox::Apply)->setText(tr("Reassign"));
+        box.setDefaultButton(QMessageBox::Ok);
+        box.setEscapeButton(QMessageBox::Ok);
+        reassignChosen = box.exec() == QMessageBox::Apply;
     }
     return true;
 }
@@ -102,9 +127,10 @@ void KeysConfForm::opt_nokeys_checked()
     const BindingId id = bindingAt(keysTree->currentItem());
     if (!id)
         return;
+    const HotkeysModel before = model;
     model.clearKey(id);
     bindingTree->refresh(id);
-    fileChanged();
+    recordEdit(tr("Clear the key of %1").arg(keysTree->currentItem()->text(0)), before, id);
     keyWidget->clearKeySequence();
     keyWidget->setEnabled(false);
 }

@@ -147,6 +147,18 @@ void TestHotkeysModel::writeBack_data()
     QTest::newRow("an unclosed quote is kept")
         << QByteArray("[ShortCutKeys]\nSuper|t=\"xterm\n") << "key|cmd:\"xterm|Meta+X"
         << QByteArray("[ShortCutKeys]\nSuper|x=\"xterm\n");
+    QTest::newRow("a system row given a new key switches its old key off")
+        << QByteArray("[ShortCutKeys]\n") << "key|ZEMWM_CLOSE|Alt+F9"
+        << QByteArray("[ShortCutKeys]\nAlt|F9=ZEMWM_CLOSE\nALT|f4=\"Disable\"\n");
+    QTest::newRow("a freed key keeps the system binding it hid switched off")
+        << QByteArray("[ShortCutKeys]\nAlt|F4=ZEMWM_LOCK\n") << "clear|ZEMWM_LOCK"
+        << QByteArray("[ShortCutKeys]\nAlt|F4=\"Disable\"\n");
+    QTest::newRow("reassign: the key moves, the old holder is left without one")
+        << QByteArray("[ShortCutKeys]\nAlt|F5=ZEMWM_LOCK\n") << "reassign|ZEMWM_CLOSE|ZEMWM_LOCK"
+        << QByteArray("[ShortCutKeys]\nAlt|F4=ZEMWM_LOCK\n");
+    QTest::newRow("revert: the system's rows, their keys no longer disabled")
+        << QByteArray("[ShortCutKeys]\nAlt|F9=ZEMWM_CLOSE\nAlt|F4=Disable\n") << "revert|ZEMWM_CLOSE"
+        << QByteArray("[ShortCutKeys]\n");
     QTest::newRow("a multi-key sequence is written with its first key")
         << QByteArray("[ShortCutKeys]\n") << "key|ZEMWM_LOCK|Ctrl+A, B"
         << QByteArray("[ShortCutKeys]\nCtrl|a=ZEMWM_LOCK\n");
@@ -171,6 +183,10 @@ void TestHotkeysModel::writeBack()
         model.clearKey(id);
     else if (words.first() == QLatin1String("command"))
         model.setCommand(id, rest);
+    else if (words.first() == QLatin1String("reassign"))
+        model.reassign(id, rowOf(model, rest));
+    else if (words.first() == QLatin1String("revert"))
+        QCOMPARE(model.revertToSystem(model.find(id)->function), QStringList());
     QVERIFY2(id, "no such row");
 
     QByteArray bytes;

@@ -58,6 +58,8 @@ private slots:
     void changedOnDisk_data();
     void changedOnDisk();
     void filterAndFindKey();
+    void undoRedo_data();
+    void undoRedo();
 
 private:
     QTreeWidgetItem* row(const QString& name, int index = 0) const;
@@ -197,9 +199,17 @@ void TestMainWindow::saveAndApplyStates()
     form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
     QVERIFY(saveEnabled());
     form->fileSave();
-    QVERIFY(!KeysConfForm::isModified());
-    QVERIFY(saveEnabled());
+    QVERIFY(!KeysConfForm::isModified() && !saveEnabled());
     QVERIFY(readFile(userFile).contains("Ctrl|Alt|e=ZEMWM_EXIT\n"));
+    // Undoing back past the state saved leaves something to save; redoing to it, nothing.
+    action("undoAction")->trigger();
+    QVERIFY(KeysConfForm::isModified() && saveEnabled());
+    action("redoAction")->trigger();
+    QVERIFY(!KeysConfForm::isModified() && !saveEnabled());
+    // A refused recording changes nothing and leaves nothing to save.
+    ModalAnswerer answerer;
+    keyWidget()->setKeySequence(QKeySequence(QStringLiteral("Alt+F5")), KKeySequenceWidget::NoValidate);
+    QVERIFY(answerer.count() == 1 && !KeysConfForm::isModified());
 
     form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+F")));
     form->fileApply();
@@ -402,6 +412,62 @@ void TestMainWindow::filterAndFindKey()
         ->setKeySequence(QKeySequence(QStringLiteral("Ctrl+Alt+Y")), KKeySequenceWidget::NoValidate);
     QCOMPARE(filter->text(), QStringLiteral("Ctrl+Alt+Y"));
     QCOMPARE(form->statusBar()->currentMessage(), QStringLiteral("Ctrl+Alt+Y is free"));
+}
+
+void TestMainWindow::undoRedo_data()
+{
+    QTest::addColumn<QString>("edit");
+    QTest::addColumn<QString>("undoText");
+    QTest::newRow("assign") << "assign"
+                            << "Undo Assign Ctrl+Alt+E to exit zem-wm";
+    QTest::newRow("clear a system key") << "clear"
+                                        << "Undo Clear the key of close a window (recommend)";
+    QTest::newRow("clone") << "clone"
+                           << "Undo Clone lock screen";
+    QTest::newRow("delete a command") << "delete"
+                                      << "Undo Delete xclock";
+    QTest::newRow("reassign") << "reassign"
+                              << "Undo Reassign Ctrl+K from close a window forcely to exit zem-wm";
+    QTest::newRow("revert") << "revert"
+                            << "Undo Revert close a window (recommend) to the system binding";
+}
+
+void TestMainWindow::undoRedo()
+{
+    QFETCH(QString, edit);
+    QFETCH(QString, undoText);
+    const auto state = [this] {
+        QStringList rows = form->disabledKeyList();
+        for (QTreeWidgetItemIterator it(form->findChild<QTreeWidget*>()); *it; ++it)
+            rows << (*it)->text(0) + '|' + KeysConfForm::itemKey(*it) + '|' + (*it)->text(3);
+        return rows;
+    };
+    ModalAnswerer answerer({edit == QLatin1String("delete") ? QMessageBox::Yes : QMessageBox::Apply});
+    if (edit == QLatin1String("revert")) {
+        select(QStringLiteral("ZEMWM_CLOSE"));
+        form->setKey(QKeySequence(QStringLiteral("Alt+F9")));
+        QVERIFY(action("revertAction")->isEnabled());
+    }
+    const QStringList before = state();
+    const QString name = edit == QLatin1String("assign") || edit == QLatin1String("reassign") ? "ZEMWM_EXIT"
+                         : edit == QLatin1String("delete")                                    ? "cmd:xclock"
+                         : edit == QLatin1String("clone")                                     ? "ZEMWM_LOCK"
+                                                                                              : "ZEMWM_CLOSE";
+    select(name);
+    if (edit == QLatin1String("assign") || edit == QLatin1String("reassign"))
+        form->setKey(QKeySequence(edit == QLatin1String("assign") ? "Ctrl+Alt+E" : "Ctrl+K"));
+    else if (edit == QLatin1String("clear"))
+        QTest::mouseClick(form->findChild<QRadioButton*>("noKeyRadio"), Qt::LeftButton);
+    else
+        action(qPrintable(edit + QLatin1String(edit == QLatin1String("revert") ? "Action" : "CommandAction")))
+            ->trigger();
+    const QStringList after = state();
+    QVERIFY(after != before);
+    QCOMPARE(action("undoAction")->text(), undoText);
+    action("undoAction")->trigger();
+    QCOMPARE(state(), before);
+    action("redoAction")->trigger();
+    QCOMPARE(state(), after);
 }
 
 ZEM_TEST_MAIN(TestMainWindow)
