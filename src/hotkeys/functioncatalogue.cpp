@@ -200,11 +200,13 @@ constexpr RawEntry catalogue[] = {
 
 } // namespace
 
-QVector<WmFunctionEntry> buildWmFunctionTable()
+QVector<WmFunctionEntry> buildWmFunctionTable(bool translated)
 {
     QVector<WmFunctionEntry> table;
     table.reserve(int(std::size(catalogue)));
     for (const RawEntry& raw : catalogue)
-        table.append({raw.keyName, QCoreApplication::translate("KeysConfForm", raw.text), raw.code});
+        table.append({raw.keyName,
+                      translated ? QCoreApplication::translate("KeysConfForm", raw.text) : QString::fromLatin1(raw.text),
+                      raw.code});
     return table;
 }

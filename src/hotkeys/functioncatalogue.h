@@ -14,4 +14,4 @@ struct WmFunctionEntry
 
 // The catalogue in its fixed order, each group entry followed by its functions, with the texts
 // translated for the current language.
-QVector<WmFunctionEntry> buildWmFunctionTable();
+QVector<WmFunctionEntry> buildWmFunctionTable(bool translated = true);

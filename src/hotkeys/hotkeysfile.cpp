@@ -97,7 +97,7 @@ QString toFileKey(const QString& keyString)
     return key;
 }
 
-QString fromFileKey(const QString& fileKey)
+QString fromFileKey(const QString& fileKey, bool* readable)
 {
     static const QRegularExpression placeholder(QStringLiteral("None[0-9]+"));
 
@@ -106,9 +106,13 @@ QString fromFileKey(const QString& fileKey)
     key.remove(QStringLiteral("None+"));
     key.remove(placeholder);
 
+    if (readable)
+        *readable = true;
     if (key == QLatin1String("XF86Calculator"))
         return QStringLiteral("Calculator");
     const QString converted = ZemKeyServer::KeyStringXToQt(key);
+    if (readable)
+        *readable = key.isEmpty() || !converted.isEmpty();
     return converted.isEmpty() ? key : converted;
 }
 

@@ -18,8 +18,9 @@ QString systemHotkeysFilePath();
 // X key-string form ("Ctrl+Alt+T") to the key of a file entry ("Ctrl|Alt|t", "None|F5").
 QString toFileKey(const QString& keyString);
 // The key of a file entry to the stored key (QKeySequence portable text); empty for the
-// placeholder keys of keyless commands. Text that cannot be converted is kept as it is.
-QString fromFileKey(const QString& fileKey);
+// placeholder keys of keyless commands. Text that cannot be converted is kept as it is, and
+// `readable` (when given) says whether the key server could read it.
+QString fromFileKey(const QString& fileKey, bool* readable = nullptr);
 // The file key a stored key is written under: its first key as the key server names it, or the
 // stored text itself when the key server cannot name it.
 QString fileKeyOf(const QString& storedKey);

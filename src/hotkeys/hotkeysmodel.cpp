@@ -303,6 +303,15 @@ QStringList HotkeysModel::disabledKeys() const
     return keys;
 }
 
+QByteArray HotkeysModel::disabledFileKey(const QString& key) const
+{
+    for (const DisabledKey& d : disabled) {
+        if (d.key == key)
+            return writtenKey(d.key, d.origin.get());
+    }
+    return ::fileKeyOf(key).toLocal8Bit();
+}
+
 bool HotkeysModel::isDisabled(const QString& key) const
 {
     return std::any_of(disabled.cbegin(), disabled.cend(),
@@ -313,7 +322,7 @@ QByteArray HotkeysModel::writtenKey(const QString& key, const EntryOrigin* origi
 {
     if (origin && key == origin->readKey && !origin->rawKey.isEmpty())
         return origin->rawKey;
-    return fileKeyOf(key).toLocal8Bit();
+    return ::fileKeyOf(key).toLocal8Bit();
 }
 
 BindingId HotkeysModel::holderOf(const QString& key, BindingId except) const
@@ -321,7 +330,7 @@ BindingId HotkeysModel::holderOf(const QString& key, BindingId except) const
     if (key.isEmpty())
         return 0;
     const QString lower = key.toLower();
-    const QByteArray fileKey = foldedKey(fileKeyOf(key).toLocal8Bit());
+    const QByteArray fileKey = foldedKey(::fileKeyOf(key).toLocal8Bit());
     for (const Binding* row : rows()) {
         if (row->id == except || row->key.isEmpty())
             continue;
@@ -450,6 +459,18 @@ BindingId HotkeysModel::addCommand(const QString& command)
 {
     commandRows.append(Binding{++lastId, -1, command, QString(), BindingSource::User, nullptr});
     return lastId;
+}
+
+BindingId HotkeysModel::rowForFunction(const QString& name)
+{
+    const int function = functionIndex().value(name, -1);
+    if (function < 0)
+        return 0;
+    for (const Binding& row : functionRows.at(function)) {
+        if (row.key.isEmpty())
+            return row.id;
+    }
+    return cloneRow(functionRows.at(function).last().id);
 }
 
 BindingId HotkeysModel::cloneRow(BindingId id)

@@ -74,6 +74,10 @@ public:
     QVector<const Binding*> rows() const;
     const Binding* find(BindingId id) const;
     QStringList disabledKeys() const;
+    // The key a disabled key is written under in the file.
+    QByteArray disabledFileKey(const QString& key) const;
+    // The key a binding is written under in the file.
+    QByteArray fileKeyOf(const Binding& binding) const { return writtenKey(binding.key, binding.origin.get()); }
     bool isDisabled(const QString& key) const;
     // Read but not shown: entries of functions this editor does not know.
     int keptEntryCount() const { return kept.size(); }
@@ -89,6 +93,8 @@ public:
     void clearKey(BindingId id);
     void setCommand(BindingId id, const QString& command);
     BindingId addCommand(const QString& command);
+    // A row for the function: its keyless row, or a further one; 0 for an unknown name.
+    BindingId rowForFunction(const QString& name);
     // A keyless copy placed right after the row; 0 when there is no such row.
     BindingId cloneRow(BindingId id);
     // False for a function's last row, which always stays.

@@ -1,0 +1,401 @@
+#include "hotkeyscli.h"
+
+#include "bindingfilter.h"
+#include "functioncatalogue.h"
+#include "hotkeysdocument.h"
+#include "hotkeysfile.h"
+#include "hotkeyslines.h"
+#include "hotkeysmodel.h"
+#include "zemwmcommand.h"
+
+#include <QCoreApplication>
+#include <QFileInfo>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QKeySequence>
+#include <QProcess>
+#include <QStandardPaths>
+#include <QTextStream>
+
+#include <X11/Xlib.h>
+
+#include <algorithm>
+
+namespace {
+
+QString tr(const char* text)
+{
+    return QCoreApplication::translate("zem-hotkeys", text);
+}
+
+const char usage[] = "Usage: zem-hotkeys list [--json] [FILE]\n"
+                     "       zem-hotkeys check [--json] [FILE...]\n"
+                     "       zem-hotkeys set KEY TARGET [--file FILE] [--force]\n"
+                     "       zem-hotkeys unset KEY [--file FILE]\n"
+                     "       zem-hotkeys apply [FILE]\n"
+                     "       zem-hotkeys --help | --version\n";
+
+struct Options
+{
+    bool json = false;
+    bool force = false;
+    bool help = false;
+    bool version = false;
+    QString file;
+    QStringList words; // the command and its arguments
+    QString error;
+};
+
+Options parse(const QStringList& arguments)
+{
+    Options options;
+    for (int i = 0; i < arguments.size(); ++i) {
+        const QString& argument = arguments.at(i);
+        if (argument == QLatin1String("--json"))
+            options.json = true;
+        else if (argument == QLatin1String("--force"))
+            options.force = true;
+        else if (argument == QLatin1String("--help") || argument == QLatin1String("-h"))
+            options.help = true;
+        else if (argument == QLatin1String("--version"))
+            options.version = true;
+        else if (argument.startsWith(QLatin1String("--file=")))
+            options.file = argument.mid(7);
+        else if (argument == QLatin1String("--file") && i + 1 < arguments.size())
+            options.file = arguments.at(++i);
+        else if (argument == QLatin1String("--")) {
+            options.words << arguments.mid(i + 1);
+            break;
+        } else if (argument.startsWith(QLatin1Char('-')) && argument.size() > 1)
+            options.error = tr("unknown option %1").arg(argument);
+        else
+            options.words << argument;
+    }
+    return options;
+}
+
+QString functionDescription(int function)
+{
+    static const QStringList descriptions = [] {
+        QStringList result;
+        for (const WmFunctionEntry& entry : buildWmFunctionTable(false)) {
+            if (entry.code != 0 && entry.keyName)
+                result << entry.text;
+        }
+        return result;
+    }();
+    return descriptions.value(function);
+}
+
+// The file an edit or a listing is about: the one named, else the user's, merged with the system's.
+struct Target
+{
+    QString path;
+    bool userFile = false;
+};
+
+Target targetOf(const QString& file)
+{
+    // A file that is named is taken alone, even the user's own.
+    return file.isEmpty() ? Target{userHotkeysFilePath(), true} : Target{file, false};
+}
+
+bool load(HotkeysModel& model, const Target& target, QTextStream& err)
+{
+    QString failed;
+    QString reason;
+    if (model.load(target.path, target.userFile ? systemHotkeysFilePath() : QString(), &failed, &reason))
+        return true;
+    err << "zem-hotkeys: " << failed << ": " << reason << '\n';
+    return false;
+}
+
+bool save(HotkeysModel& model, const Target& target, QTextStream& err)
+{
+    QByteArray bytes;
+    QString reason;
+    if (model.toBytes(target.userFile, &bytes, &reason) && writeFileSafely(target.path, bytes, &reason))
+        return true;
+    err << "zem-hotkeys: " << target.path << ": " << reason << '\n';
+    return false;
+}
+
+QString readKey(const QString& text, QTextStream& err)
+{
+    const QString key = keyFromUserText(text);
+    if (key.isEmpty())
+        err << "zem-hotkeys: " << tr("cannot read the key \"%1\"").arg(text) << '\n';
+    return key;
+}
+
+QString describe(const Binding& binding)
+{
+    return binding.isCommand() ? binding.command : HotkeysModel::functionNames().at(binding.function);
+}
+
+int list(const Options& options, QTextStream& out, QTextStream& err)
+{
+    if (options.words.size() > 2)
+        return UsageError;
+    HotkeysModel model;
+    if (!load(model, targetOf(options.words.value(1)), err))
+        return Failed;
+    QJsonArray entries;
+    const auto add = [&](const QString& key, const QString& function, const QString& command,
+                         const QString& action, const QString& source) {
+        if (!options.json) {
+            out << key << '\t'
+                << (!function.isEmpty()  ? function
+                    : !command.isEmpty() ? command
+                                         : action)
+                << '\t' << source << '\n';
+            return;
+        }
+        const QString stored = fromFileKey(key);
+        entries.append(QJsonObject{
+            {"key", key},
+            {"shown", stored.isEmpty() ? QString() : stored},
+            {"function", function.isEmpty() ? QJsonValue() : QJsonValue(function)},
+            {"command", command.isEmpty() ? QJsonValue() : QJsonValue(command)},
+            {"action", action},
+            {"source", source},
+        });
+    };
+    for (const Binding* row : model.rows()) {
+        if (!row->isCommand() && row->key.isEmpty())
+            continue;
+        const QString key = row->key.isEmpty() ? QString() : QString::fromLocal8Bit(model.fileKeyOf(*row));
+        const QString source =
+            row->source == BindingSource::System ? QStringLiteral("system") : QStringLiteral("user");
+        if (row->isCommand())
+            add(key, QString(), row->command, row->command, source);
+        else
+            add(key, HotkeysModel::functionNames().at(row->function), QString(),
+                functionDescription(row->function), source);
+    }
+    for (const QString& key : model.disabledKeys())
+        add(QString::fromLocal8Bit(model.disabledFileKey(key)), QString(), QString(),
+            QStringLiteral("Disable"), QStringLiteral("user"));
+    if (options.json)
+        out << QJsonDocument(entries).toJson(QJsonDocument::Indented);
+    return 0;
+}
+
+struct Finding
+{
+    QString path;
+    int line;
+    bool error;
+    QString text;
+};
+
+bool programExists(const QString& command)
+{
+    // Large files run the same few programs thousands of times; each is looked up once.
+    static QHash<QString, bool> known;
+    const QString program = QProcess::splitCommand(command).value(0);
+    const auto it = known.constFind(program);
+    if (it != known.cend())
+        return *it;
+    bool exists = false;
+    if (program.contains(QLatin1Char('/'))) {
+        const QFileInfo info(program);
+        exists = info.isFile() && info.isExecutable();
+    } else if (!program.isEmpty()) {
+        exists = !QStandardPaths::findExecutable(program).isEmpty();
+    }
+    known.insert(program, exists);
+    return exists;
+}
+
+// A key of one printable character without Ctrl, Alt or Meta takes that character from typing.
+bool swallowsTyping(const QString& storedKey)
+{
+    const QKeySequence sequence = QKeySequence::fromString(storedKey, QKeySequence::PortableText);
+    if (sequence.count() != 1)
+        return false;
+    const int combined = sequence[0];
+    const int key = combined & ~int(Qt::KeyboardModifierMask);
+    const bool chord = combined & int(Qt::ControlModifier | Qt::AltModifier | Qt::MetaModifier);
+    return !chord && key < 0x01000000 && QChar::isPrint(uint(key));
+}
+
+void checkFile(const QString& path, QVector<Finding>& findings)
+{
+    QByteArray bytes;
+    QString reason;
+    HotkeysDocument document;
+    if (!readHotkeysFile(path, &bytes, &reason)) {
+        findings.append({path, 0, true, reason});
+        return;
+    }
+    if (!document.load(bytes)) {
+        findings.append({path, 0, true, tr("no [ShortCutKeys] section")});
+        return;
+    }
+    const HotkeysLines lines(bytes);
+    QHash<QByteArray, int> seen;
+    for (const HotkeysLine& line : lines.lines()) {
+        if (line.kind != HotkeysLine::Entry || !lines.isHotkeysSection(line.section))
+            continue;
+        const QString key = QString::fromLocal8Bit(line.key);
+        const QString value = unquoted(QString::fromLocal8Bit(line.value));
+        const auto say = [&](bool error, const QString& text) {
+            findings.append({path, line.number, error, text});
+        };
+        bool readable = true;
+        const QString stored = fromFileKey(key, &readable);
+        if (!readable)
+            say(true, tr("the key %1 cannot be read").arg(key));
+        if (const int earlier = seen.value(foldedKey(line.key)))
+            say(false, tr("the key %1 is on line %2 too; only this line counts").arg(key).arg(earlier));
+        seen.insert(foldedKey(line.key), line.number);
+        if (value.startsWith(QLatin1String("ZEMWM_"))) {
+            if (!HotkeysModel::functionNames().contains(value))
+                say(true, tr("%1 is no function of the window manager").arg(value));
+        } else if (value != QLatin1String("Disable") && !programExists(value)) {
+            say(false, tr("the program of \"%1\" is not installed").arg(value));
+        }
+        if (readable && value != QLatin1String("Disable") && swallowsTyping(stored))
+            say(false, tr("the key %1 alone takes a character from typing").arg(key));
+    }
+}
+
+int check(const Options& options, QTextStream& out)
+{
+    QStringList files = options.words.mid(1);
+    if (files.isEmpty())
+        files << userHotkeysFilePath() << systemHotkeysFilePath();
+    QVector<Finding> findings;
+    for (const QString& file : qAsConst(files))
+        checkFile(file, findings);
+    QJsonArray entries;
+    for (const Finding& finding : qAsConst(findings)) {
+        const QString severity = finding.error ? QStringLiteral("error") : QStringLiteral("warning");
+        if (options.json)
+            entries.append(QJsonObject{{"file", finding.path},
+                                       {"line", finding.line},
+                                       {"severity", severity},
+                                       {"message", finding.text}});
+        else
+            out << finding.path << ':' << finding.line << ": " << severity << ": " << finding.text << '\n';
+    }
+    if (options.json)
+        out << QJsonDocument(entries).toJson(QJsonDocument::Indented);
+    const bool errors =
+        std::any_of(findings.cbegin(), findings.cend(), [](const Finding& f) { return f.error; });
+    return errors ? Failed : findings.isEmpty() ? 0 : CheckWarnings;
+}
+
+int set(const Options& options, QTextStream& out, QTextStream& err)
+{
+    if (options.words.size() != 3)
+        return UsageError;
+    const QString key = readKey(options.words.at(1), err);
+    const QString target = options.words.at(2).simplified();
+    if (key.isEmpty())
+        return Failed;
+    const bool function = target.startsWith(QLatin1String("ZEMWM_"));
+    if (function && !HotkeysModel::functionNames().contains(target)) {
+        err << "zem-hotkeys: " << tr("%1 is no function of the window manager").arg(target) << '\n';
+        return Failed;
+    }
+    HotkeysModel model;
+    const Target file = targetOf(options.file);
+    if (!load(model, file, err))
+        return Failed;
+    if (const Binding* holder = model.find(model.holderOf(key))) {
+        if (describe(*holder) == target) {
+            out << tr("%1 already does %2").arg(options.words.at(1), target) << '\n';
+            return 0;
+        }
+        if (!options.force) {
+            err << "zem-hotkeys: "
+                << tr("%1 is held by %2; --force takes it over").arg(options.words.at(1), describe(*holder))
+                << '\n';
+            return KeyTaken;
+        }
+        model.clearKey(holder->id);
+    }
+    const BindingId row = function ? model.rowForFunction(target) : model.addCommand(target);
+    model.setKey(row, key);
+    return save(model, file, err) ? 0 : Failed;
+}
+
+int unset(const Options& options, QTextStream& err)
+{
+    if (options.words.size() != 2)
+        return UsageError;
+    const QString key = readKey(options.words.at(1), err);
+    if (key.isEmpty())
+        return Failed;
+    HotkeysModel model;
+    const Target file = targetOf(options.file);
+    if (!load(model, file, err))
+        return Failed;
+    const Binding* holder = model.find(model.holderOf(key));
+    if (!holder) {
+        err << "zem-hotkeys: " << tr("no binding holds %1").arg(options.words.at(1)) << '\n';
+        return Failed;
+    }
+    // A function's only row stays, without its key; any other row goes.
+    if (!model.removeRow(holder->id))
+        model.clearKey(holder->id);
+    return save(model, file, err) ? 0 : Failed;
+}
+
+int apply(const Options& options, QTextStream& err)
+{
+    if (options.words.size() > 2)
+        return UsageError;
+    const QString path = targetOf(options.words.value(1)).path;
+    const QByteArray command = "ZEMWM_UPDATE_VAL SCKeysFile " + path.toLocal8Bit() + '\n';
+    if (std::any_of(command.cbegin(), command.cend() - 1,
+                    [](char c) { return uchar(c) < 0x20 || c == 0x7f; })) {
+        err << "zem-hotkeys: " << tr("the file name holds control characters") << '\n';
+        return Failed;
+    }
+    Display* display = XOpenDisplay(nullptr);
+    if (!display) {
+        err << "zem-hotkeys: " << tr("no X display; the window manager cannot be told") << '\n';
+        return Failed;
+    }
+    const bool sent = SendCommandToWM(display, command.constData());
+    XCloseDisplay(display);
+    if (!sent)
+        err << "zem-hotkeys: " << tr("the X display refused the command") << '\n';
+    return sent ? 0 : Failed;
+}
+
+} // namespace
+
+int runHotkeysCommand(const QStringList& arguments, QTextStream& out, QTextStream& err)
+{
+    const Options options = parse(arguments);
+    if (options.help) {
+        out << usage;
+        return 0;
+    }
+    if (options.version) {
+        out << "zem-hotkeys " << QCoreApplication::applicationVersion() << '\n';
+        return 0;
+    }
+    const QString command = options.words.value(0);
+    int status = UsageError;
+    if (!options.error.isEmpty())
+        err << "zem-hotkeys: " << options.error << '\n';
+    else if (command == QLatin1String("list"))
+        status = list(options, out, err);
+    else if (command == QLatin1String("check"))
+        status = check(options, out);
+    else if (command == QLatin1String("set"))
+        status = set(options, out, err);
+    else if (command == QLatin1String("unset"))
+        status = unset(options, err);
+    else if (command == QLatin1String("apply"))
+        status = apply(options, err);
+    if (status == UsageError)
+        err << usage;
+    return status;
+}

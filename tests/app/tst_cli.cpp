@@ -1,0 +1,190 @@
+// zem-hotkeys as an administrator runs it: a process of its own on small files, no display but
+// for apply; what it prints, its exit statuses and the bytes it writes.
+#include <QProcess>
+#include <QTemporaryDir>
+#include <QtTest>
+
+#include <X11/Xlib.h>
+
+class TestCli : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void init();
+    void check_data();
+    void check();
+    void list();
+    void edit_data();
+    void edit();
+    void applyAndUsage();
+
+private:
+    // Runs zem-hotkeys; gives its exit status and fills what it printed.
+    int run(const QStringList& arguments, bool display = false);
+    void write(const QString& name, const QByteArray& entries);
+    QByteArray read(const QString& name) const;
+
+    QTemporaryDir dir;
+    QByteArray out;
+    QByteArray err;
+};
+
+void TestCli::init()
+{
+    write(QStringLiteral("system/keyshortcutrc"), "Alt|F4=ZEMWM_CLOSE\nCtrl|Alt|t=\"sh -c true\"\n");
+    write(QStringLiteral("user/keyshortcutrc"), "Alt|F5=ZEMWM_LOCK\nCtrl|q=\"Disable\"\n");
+}
+
+void TestCli::write(const QString& name, const QByteArray& entries)
+{
+    QDir().mkpath(QFileInfo(dir.filePath(name)).path());
+    QFile file(dir.filePath(name));
+    QVERIFY(file.open(QIODevice::WriteOnly) &&
+            file.write(entries.startsWith('!') ? entries.mid(1) : "[ShortCutKeys]\n" + entries) > 0);
+}
+
+QByteArray TestCli::read(const QString& name) const
+{
+    QFile file(dir.filePath(name));
+    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+}
+
+int TestCli::run(const QStringList& arguments, bool display)
+{
+    QProcess process;
+    QProcessEnvironment env = QProcessEnvironment::systemEnvironment();
+    env.insert(QStringLiteral("ZEM_USER_DIR"), dir.filePath(QStringLiteral("user")));
+    env.insert(QStringLiteral("ZEM_SYSTEM_DIR"), dir.filePath(QStringLiteral("system")));
+    env.insert(QStringLiteral("LANG"), QStringLiteral("C.UTF-8"));
+    if (!display)
+        env.remove(QStringLiteral("DISPLAY"));
+    process.setProcessEnvironment(env);
+    process.start(QStringLiteral(ZEM_CLI_BINARY), arguments);
+    process.waitForFinished(10000);
+    out = process.readAllStandardOutput();
+    err = process.readAllStandardError();
+    return process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1;
+}
+
+void TestCli::check_data()
+{
+    QTest::addColumn<QByteArray>("entries");
+    QTest::addColumn<QByteArray>("findings"); // the lines printed, the file's path taken out
+    QTest::addColumn<int>("status");
+
+    QTest::newRow("nothing to say") << QByteArray("Alt|F4=ZEMWM_CLOSE\nCtrl|t=\"sh -c true\"\n")
+                                    << QByteArray() << 0;
+    QTest::newRow("no section") << QByteArray("!a=b\n")
+                                << QByteArray(":0: error: no [ShortCutKeys] section\n") << 2;
+    QTest::newRow("an unknown function")
+        << QByteArray("Alt|u=ZEMWM_NOPE\n")
+        << QByteArray(":2: error: ZEMWM_NOPE is no function of the window manager\n") << 2;
+    QTest::newRow("a key the key server cannot read")
+        << QByteArray("Ctrl|Bogus=ZEMWM_CLOSE\n")
+        << QByteArray(":2: error: the key Ctrl|Bogus cannot be read\n") << 2;
+    QTest::newRow("the same key twice: the later line is named")
+        << QByteArray("Alt|x=ZEMWM_CLOSE\nALT|X=ZEMWM_LOCK\n")
+        << QByteArray(":3: warning: the key ALT|X is on line 2 too; only this line counts\n") << 1;
+    QTest::newRow("a program that is not there, on PATH or by path")
+        << QByteArray("Alt|a=\"no-such-program -x\"\nAlt|b=\"/no/such/dir/prog\"\n")
+        << QByteArray(":2: warning: the program of \"no-such-program -x\" is not installed\n"
+                      ":3: warning: the program of \"/no/such/dir/prog\" is not installed\n")
+        << 1;
+    QTest::newRow("one character alone swallows typing")
+        << QByteArray("None|q=ZEMWM_CLOSE\n")
+        << QByteArray(":2: warning: the key None|q alone takes a character from typing\n") << 1;
+}
+
+void TestCli::check()
+{
+    QFETCH(QByteArray, entries);
+    QFETCH(QByteArray, findings);
+    QFETCH(int, status);
+    write(QStringLiteral("f.rc"), entries);
+    QCOMPARE(run({QStringLiteral("check"), dir.filePath(QStringLiteral("f.rc"))}), status);
+    QCOMPARE(out.replace(QFile::encodeName(dir.filePath(QStringLiteral("f.rc"))), ""), findings);
+}
+
+void TestCli::list()
+{
+    // The user's file over the system file, as the editor shows them, then the disabled keys.
+    QCOMPARE(run({QStringLiteral("list")}), 0);
+    QVERIFY(out.startsWith("Alt|F4\tZEMWM_CLOSE\tsystem\n"));
+    QVERIFY(
+        out.endsWith("Alt|F5\tZEMWM_LOCK\tuser\nCtrl|Alt|t\tsh -c true\tsystem\nCtrl|q\tDisable\tuser\n"));
+    QCOMPARE(out.count('\n'), 4);
+    QCOMPARE(run({QStringLiteral("--json"), QStringLiteral("list"),
+                  dir.filePath(QStringLiteral("user/keyshortcutrc"))}),
+             0);
+    const QJsonArray entries = QJsonDocument::fromJson(out).array();
+    QCOMPARE(entries.size(), 2);
+    QCOMPARE(entries.at(0).toObject(), (QJsonObject{{"key", "Alt|F5"},
+                                                    {"shown", "Alt+F5"},
+                                                    {"function", "ZEMWM_LOCK"},
+                                                    {"command", QJsonValue()},
+                                                    {"action", "lock screen"},
+                                                    {"source", "user"}}));
+}
+
+void TestCli::edit_data()
+{
+    QTest::addColumn<QStringList>("arguments");
+    QTest::addColumn<int>("status");
+    QTest::addColumn<QByteArray>("written"); // the user's file afterwards, its section line left out
+
+    const QByteArray untouched = "Alt|F5=ZEMWM_LOCK\nCtrl|q=\"Disable\"\n";
+    QTest::newRow("set a free key, options last")
+        << QStringList{"set", "alt+ctrl+k", "xterm  -e top", "--file", "user/keyshortcutrc"} << 0
+        << QByteArray("Alt|F5=ZEMWM_LOCK\nCtrl|Alt|k=\"xterm -e top\"\nCtrl|q=\"Disable\"\n");
+    QTest::newRow("set a key another binding holds")
+        << QStringList{"set", "Alt|F4", "ZEMWM_EXIT"} << 3 << untouched;
+    QTest::newRow("--force takes it over, the system binding switched off")
+        << QStringList{"--force", "set", "Alt+F4", "ZEMWM_EXIT"} << 0
+        << QByteArray("Alt|F5=ZEMWM_LOCK\nAlt|F4=ZEMWM_EXIT\nCtrl|q=\"Disable\"\n");
+    QTest::newRow("an unknown function") << QStringList{"set", "Alt+F9", "ZEMWM_NOPE"} << 2 << untouched;
+    QTest::newRow("an unreadable key") << QStringList{"set", "Ctrl+Bogus", "ZEMWM_EXIT"} << 2 << untouched;
+    QTest::newRow("unset a system key: it stays off")
+        << QStringList{"unset", "Ctrl+Alt+T"} << 0 << QByteArray(untouched + "Ctrl|Alt|t=\"Disable\"\n");
+    QTest::newRow("unset a key nobody holds") << QStringList{"unset", "Ctrl+Alt+Y"} << 2 << untouched;
+}
+
+void TestCli::edit()
+{
+    QFETCH(QStringList, arguments);
+    QFETCH(int, status);
+    QFETCH(QByteArray, written);
+    for (QString& argument : arguments) {
+        if (argument.startsWith(QLatin1String("user/")))
+            argument = dir.filePath(argument);
+    }
+    QCOMPARE(run(arguments), status);
+    QCOMPARE(read(QStringLiteral("user/keyshortcutrc")), "[ShortCutKeys]\n" + written);
+    QCOMPARE(err.isEmpty(), status == 0);
+}
+
+void TestCli::applyAndUsage()
+{
+    // Held open so that the X server keeps the property, as the window manager's connection does.
+    Display* display = XOpenDisplay(nullptr);
+    QVERIFY(display);
+    const auto close = qScopeGuard([display] { XCloseDisplay(display); });
+    QProcess::execute(QStringLiteral("xprop"), QStringLiteral("-root -remove _ZEMWM_COMMAND").split(' '));
+    QCOMPARE(run({QStringLiteral("apply")}, true), 0);
+    QProcess xprop;
+    xprop.start(QStringLiteral("xprop"), QStringLiteral("-root -notype _ZEMWM_COMMAND").split(' '));
+    QVERIFY(xprop.waitForFinished());
+    QVERIFY(xprop.readAllStandardOutput().contains(
+        "ZEMWM_UPDATE_VAL SCKeysFile " +
+        QFile::encodeName(dir.filePath(QStringLiteral("user/keyshortcutrc")))));
+    QProcess::execute(QStringLiteral("xprop"), QStringLiteral("-root -remove _ZEMWM_COMMAND").split(' '));
+    QCOMPARE(run({QStringLiteral("apply")}), 2);
+    QVERIFY(err.startsWith("zem-hotkeys: "));
+    QCOMPARE(run({}), 64);
+    QVERIFY(err.startsWith("Usage: zem-hotkeys") && out.isEmpty());
+    QCOMPARE(run({QStringLiteral("--help")}), 0);
+    QVERIFY(out.startsWith("Usage: zem-hotkeys") && err.isEmpty());
+}
+
+QTEST_GUILESS_MAIN(TestCli)
+#include "tst_cli.moc"
