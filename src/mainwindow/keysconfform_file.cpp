@@ -10,6 +10,7 @@
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QMessageBox>
+#include <QTimer>
 #include <QTreeWidget>
 #include <QUndoStack>
 #include <QX11Info>
@@ -136,8 +137,10 @@ bool KeysConfForm::loadFile(const QString& path)
     keysTree->setUpdatesEnabled(false);
     fillFunctionTree();
     keysTree->setUpdatesEnabled(true);
-    // A new tree shows what the filter asks for.
+    // A new tree shows what the filter asks for; what the filter looks at is made while the
+    // user has not begun to type, so that the first keystroke does not wait for it.
     applyFilter();
+    QTimer::singleShot(0, this, [this] { bindingTree->searchRows(); });
     // A loaded file has nothing to undo and no unsaved edits.
     undoStack->clear();
     fileChanged();

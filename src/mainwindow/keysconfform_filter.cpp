@@ -69,6 +69,11 @@ void KeysConfForm::applyFilter()
     filterTimer->stop();
     const BindingFilter filter(filterEdit->text());
     const bool filtering = !filter.isEmpty();
+    // Nothing is hidden while there is no filter, so a new tree needs nothing then.
+    if (!filtering && !wasFiltering) {
+        filterStatus->clear();
+        return;
+    }
     keysTree->setUpdatesEnabled(false);
     // The groups the user had open come back when the filter is emptied.
     if (filtering && !wasFiltering) {
