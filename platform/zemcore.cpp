@@ -23,6 +23,21 @@ QString withoutTrailingSlash(QString path)
     return path;
 }
 
+// A directory of the installation the running program belongs to, found from where the program
+// is, so that an installation works under whatever prefix it was put; the system configuration
+// of a program in /usr/bin is /etc. `fallback` where there is no such directory (a build tree).
+QString besideProgram(const QString& fromBin, const QString& fallback)
+{
+    const QString bin = QCoreApplication::instance() ? QCoreApplication::applicationDirPath() : QString();
+    if (bin.isEmpty())
+        return fallback;
+    QString dir = QDir::cleanPath(bin + QLatin1Char('/') + fromBin);
+    if (QDir::cleanPath(bin + QLatin1String("/..")) == QLatin1String("/usr") &&
+        dir.startsWith(QLatin1String("/usr/etc/")))
+        dir = dir.mid(4);
+    return QFileInfo(dir).isDir() ? dir : fallback;
+}
+
 QString userConfigDir()
 {
     QString dir = environmentPath("ZEM_USER_DIR");
@@ -75,11 +90,19 @@ void zemInit(const char* version, const char* displayName)
     if (!app)
         return;
     useInstalledIconTheme();
+    zemInstallTranslations();
+}
+
+void zemInstallTranslations()
+{
+    QCoreApplication* app = QCoreApplication::instance();
+    if (!app)
+        return;
     // Qt's own catalogue translates the standard buttons of the message boxes.
     installTranslator(new QTranslator(app), QStringLiteral("qtbase"),
                       QLibraryInfo::location(QLibraryInfo::TranslationsPath));
     installTranslator(new QTranslator(app), QStringLiteral("zem-admin-hotkeys"),
-                      QStringLiteral(ZEM_BUILD_TRANSLATIONS_DIR));
+                      besideProgram(QStringLiteral(ZEM_TRANSLATIONS_FROM_BIN), QString()));
 }
 
 const std::string& GetZemDir(ZemDir which)
@@ -98,7 +121,7 @@ const std::string& GetZemDir(ZemDir which)
 
     QString dir = environmentPath("ZEM_SYSTEM_DIR");
     if (dir.isEmpty())
-        dir = QStringLiteral(ZEM_BUILD_SYSTEM_DIR);
+        dir = besideProgram(QStringLiteral(ZEM_SYSTEM_DIR_FROM_BIN), QStringLiteral(ZEM_BUILD_SYSTEM_DIR));
     systemDir = withoutTrailingSlash(dir).toUtf8().toStdString();
     return systemDir;
 }

@@ -17,6 +17,9 @@ enum WhatZemSession {
 // sets the version and desktop entry name, and installs the translations for the current locale.
 // Call once, after the application object exists.
 void zemInit(const char* version, const char* displayName);
+// The translations for the current locale, Qt's and the programs' own, found beside the
+// installed program; zemInit installs them, a program without widgets calls this alone.
+void zemInstallTranslations();
 
 // A UTF-8 path without a trailing "/". The user's directory is created when it is missing,
 // so that the first start of a new account can write its hotkeys file there.

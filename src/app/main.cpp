@@ -40,6 +40,11 @@ int printUsage()
 
 int main(int argc, char** argv)
 {
+    // Asked before anything else, and answered without a display or another editor's help.
+    if (argc > 1 && std::strcmp(argv[1], "--version") == 0) {
+        std::printf("zem-admin-hotkeys %s\n", ZEM_VERSION_STRING);
+        return 0;
+    }
     // Without a display Qt would abort in the application object; the usage needs none, and
     // anything else is told in one line.
     const QByteArray display = displayToOpen(argc, argv);
@@ -51,6 +56,7 @@ int main(int argc, char** argv)
         return NoDisplay;
     }
 
+    Q_INIT_RESOURCE(icons);
     auto* app = new MyApplication(singleInstanceId(), argc, argv);
     if (app->isRunning()) {
         app->sendMessage(QStringLiteral("show"), 5000);
@@ -58,7 +64,7 @@ int main(int argc, char** argv)
         return AnotherInstanceShown;
     }
 
-    zemInit("2.8.16", "Zem hotkeys editor");
+    zemInit(ZEM_VERSION_STRING, "Zem hotkeys editor");
 
     // The toolkit has taken its own options out of argc and argv by now.
     QStringList arguments;

@@ -10,8 +10,14 @@
 
 QIcon editorWindowIcon()
 {
-    const QIcon icon = QIcon::fromTheme(QStringLiteral("preferences-desktop-keyboard-khotkeys"));
-    return icon.isNull() ? QIcon::fromTheme(QStringLiteral("preferences-desktop-keyboard")) : icon;
+    for (const char* name : {"preferences-desktop-keyboard-khotkeys", "preferences-desktop-keyboard"}) {
+        const QIcon icon = QIcon::fromTheme(QLatin1String(name));
+        if (!icon.isNull())
+            return icon;
+    }
+    // The editor's own, from the icon theme where it is installed, else from the program itself.
+    return QIcon::fromTheme(QStringLiteral("zem-admin-hotkeys"),
+                            QIcon(QStringLiteral(":/icons/zem-admin-hotkeys.svg")));
 }
 
 QString singleInstanceId()

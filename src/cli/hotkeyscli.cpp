@@ -24,10 +24,11 @@
 
 namespace {
 
-QString tr(const char* text)
+// Its messages, translated in a context of their own.
+struct ZemHotkeys
 {
-    return QCoreApplication::translate("zem-hotkeys", text);
-}
+    Q_DECLARE_TR_FUNCTIONS(ZemHotkeys)
+};
 
 const char usage[] = "Usage: zem-hotkeys list [--json] [FILE]\n"
                      "       zem-hotkeys check [--json] [FILE...]\n"
@@ -68,7 +69,7 @@ Options parse(const QStringList& arguments)
             options.words << arguments.mid(i + 1);
             break;
         } else if (argument.startsWith(QLatin1Char('-')) && argument.size() > 1)
-            options.error = tr("unknown option %1").arg(argument);
+            options.error = ZemHotkeys::tr("unknown option %1").arg(argument);
         else
             options.words << argument;
     }
@@ -105,6 +106,17 @@ bool load(HotkeysModel& model, const Target& target, QTextStream& err)
 {
     QString failed;
     QString reason;
+    // A user who never saved a binding has no file yet: that is an empty one, as the editor
+    // would create it.
+    if (target.userFile && !QFileInfo::exists(target.path)) {
+        QByteArray system;
+        const QString systemPath = systemHotkeysFilePath();
+        if (readHotkeysFile(systemPath, &system, &reason) && model.loadBytes(emptyHotkeysFile, system, true))
+            return true;
+        err << "zem-hotkeys: " << systemPath << ": "
+            << (reason.isEmpty() ? ZemHotkeys::tr("no [ShortCutKeys] section") : reason) << '\n';
+        return false;
+    }
     if (model.load(target.path, target.userFile ? systemHotkeysFilePath() : QString(), &failed, &reason))
         return true;
     err << "zem-hotkeys: " << failed << ": " << reason << '\n';
@@ -125,7 +137,7 @@ QString readKey(const QString& text, QTextStream& err)
 {
     const QString key = keyFromUserText(text);
     if (key.isEmpty())
-        err << "zem-hotkeys: " << tr("cannot read the key \"%1\"").arg(text) << '\n';
+        err << "zem-hotkeys: " << ZemHotkeys::tr("cannot read the key \"%1\"").arg(text) << '\n';
     return key;
 }
 
@@ -231,7 +243,7 @@ void checkFile(const QString& path, QVector<Finding>& findings)
         return;
     }
     if (!document.load(bytes)) {
-        findings.append({path, 0, true, tr("no [ShortCutKeys] section")});
+        findings.append({path, 0, true, ZemHotkeys::tr("no [ShortCutKeys] section")});
         return;
     }
     const HotkeysLines lines(bytes);
@@ -247,18 +259,19 @@ void checkFile(const QString& path, QVector<Finding>& findings)
         bool readable = true;
         const QString stored = fromFileKey(key, &readable);
         if (!readable)
-            say(true, tr("the key %1 cannot be read").arg(key));
+            say(true, ZemHotkeys::tr("the key %1 cannot be read").arg(key));
         if (const int earlier = seen.value(foldedKey(line.key)))
-            say(false, tr("the key %1 is on line %2 too; only this line counts").arg(key).arg(earlier));
+            say(false,
+                ZemHotkeys::tr("the key %1 is on line %2 too; only this line counts").arg(key).arg(earlier));
         seen.insert(foldedKey(line.key), line.number);
         if (value.startsWith(QLatin1String("ZEMWM_"))) {
             if (!HotkeysModel::functionNames().contains(value))
-                say(true, tr("%1 is no function of the window manager").arg(value));
+                say(true, ZemHotkeys::tr("%1 is no function of the window manager").arg(value));
         } else if (value != QLatin1String("Disable") && !programExists(value)) {
-            say(false, tr("the program of \"%1\" is not installed").arg(value));
+            say(false, ZemHotkeys::tr("the program of \"%1\" is not installed").arg(value));
         }
         if (readable && value != QLatin1String("Disable") && swallowsTyping(stored))
-            say(false, tr("the key %1 alone takes a character from typing").arg(key));
+            say(false, ZemHotkeys::tr("the key %1 alone takes a character from typing").arg(key));
     }
 }
 
@@ -298,7 +311,8 @@ int set(const Options& options, QTextStream& out, QTextStream& err)
         return Failed;
     const bool function = target.startsWith(QLatin1String("ZEMWM_"));
     if (function && !HotkeysModel::functionNames().contains(target)) {
-        err << "zem-hotkeys: " << tr("%1 is no function of the window manager").arg(target) << '\n';
+        err << "zem-hotkeys: " << ZemHotkeys::tr("%1 is no function of the window manager").arg(target)
+            << '\n';
         return Failed;
     }
     HotkeysModel model;
@@ -307,12 +321,13 @@ int set(const Options& options, QTextStream& out, QTextStream& err)
         return Failed;
     if (const Binding* holder = model.find(model.holderOf(key))) {
         if (describe(*holder) == target) {
-            out << tr("%1 already does %2").arg(options.words.at(1), target) << '\n';
+            out << ZemHotkeys::tr("%1 already does %2").arg(options.words.at(1), target) << '\n';
             return 0;
         }
         if (!options.force) {
             err << "zem-hotkeys: "
-                << tr("%1 is held by %2; --force takes it over").arg(options.words.at(1), describe(*holder))
+                << ZemHotkeys::tr("%1 is held by %2; --force takes it over")
+                       .arg(options.words.at(1), describe(*holder))
                 << '\n';
             return KeyTaken;
         }
@@ -336,7 +351,7 @@ int unset(const Options& options, QTextStream& err)
         return Failed;
     const Binding* holder = model.find(model.holderOf(key));
     if (!holder) {
-        err << "zem-hotkeys: " << tr("no binding holds %1").arg(options.words.at(1)) << '\n';
+        err << "zem-hotkeys: " << ZemHotkeys::tr("no binding holds %1").arg(options.words.at(1)) << '\n';
         return Failed;
     }
     // A function's only row stays, without its key; any other row goes.
@@ -353,18 +368,18 @@ int apply(const Options& options, QTextStream& err)
     const QByteArray command = "ZEMWM_UPDATE_VAL SCKeysFile " + path.toLocal8Bit() + '\n';
     if (std::any_of(command.cbegin(), command.cend() - 1,
                     [](char c) { return uchar(c) < 0x20 || c == 0x7f; })) {
-        err << "zem-hotkeys: " << tr("the file name holds control characters") << '\n';
+        err << "zem-hotkeys: " << ZemHotkeys::tr("the file name holds control characters") << '\n';
         return Failed;
     }
     Display* display = XOpenDisplay(nullptr);
     if (!display) {
-        err << "zem-hotkeys: " << tr("no X display; the window manager cannot be told") << '\n';
+        err << "zem-hotkeys: " << ZemHotkeys::tr("no X display; the window manager cannot be told") << '\n';
         return Failed;
     }
     const bool sent = SendCommandToWM(display, command.constData());
     XCloseDisplay(display);
     if (!sent)
-        err << "zem-hotkeys: " << tr("the X display refused the command") << '\n';
+        err << "zem-hotkeys: " << ZemHotkeys::tr("the X display refused the command") << '\n';
     return sent ? 0 : Failed;
 }
 

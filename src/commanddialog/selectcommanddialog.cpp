@@ -65,6 +65,11 @@ SelectCommandDialog::SelectCommandDialog(QWidget* parent) : QDialog(parent)
     commandLabel->setText(QCoreApplication::translate("commandDialog", "Command:"));
     selectCommandFileButton->setText(QCoreApplication::translate("commandDialog", "..."));
     selectFromMenuButton->setText(QCoreApplication::translate("commandDialog", "..."));
+    // Two buttons reading "..." say nothing to a screen reader or a new user.
+    selectCommandFileButton->setToolTip(tr("Choose a program file"));
+    selectCommandFileButton->setAccessibleName(selectCommandFileButton->toolTip());
+    selectFromMenuButton->setToolTip(tr("Choose an application from the menu"));
+    selectFromMenuButton->setAccessibleName(selectFromMenuButton->toolTip());
 
     connect(buttonBox, &QDialogButtonBox::accepted, this, &SelectCommandDialog::accept);
     connect(buttonBox, &QDialogButtonBox::rejected, this, &SelectCommandDialog::reject);

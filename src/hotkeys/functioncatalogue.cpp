@@ -206,7 +206,8 @@ QVector<WmFunctionEntry> buildWmFunctionTable(bool translated)
     table.reserve(int(std::size(catalogue)));
     for (const RawEntry& raw : catalogue)
         table.append({raw.keyName,
-                      translated ? QCoreApplication::translate("KeysConfForm", raw.text) : QString::fromLatin1(raw.text),
+                      translated ? QCoreApplication::translate("KeysConfForm", raw.text)
+                                 : QString::fromLatin1(raw.text),
                       raw.code});
     return table;
 }

@@ -29,10 +29,11 @@ QString systemReason(int error)
     return QString::fromLocal8Bit(std::strerror(error));
 }
 
-QString tr(const char* text)
+// Its messages, translated in a context of their own.
+struct HotkeysFile
 {
-    return QCoreApplication::translate("HotkeysFile", text);
-}
+    Q_DECLARE_TR_FUNCTIONS(HotkeysFile)
+};
 
 // The file a path finally names, following symbolic links, so that saving through a link
 // replaces the file behind it and the link stays.
@@ -162,7 +163,7 @@ QByteArray foldedKey(const QByteArray& key)
 bool readHotkeysFile(const QString& path, QByteArray* bytes, QString* reason)
 {
     if (path.isEmpty()) {
-        *reason = tr("No file name");
+        *reason = HotkeysFile::tr("No file name");
         return false;
     }
     // Only regular files: a directory would be parsed as garbage, a device such as /dev/zero
@@ -173,11 +174,11 @@ bool readHotkeysFile(const QString& path, QByteArray* bytes, QString* reason)
         return false;
     }
     if (!info.isFile()) {
-        *reason = tr("Not a regular file");
+        *reason = HotkeysFile::tr("Not a regular file");
         return false;
     }
     if (info.size() > largestHotkeysFile) {
-        *reason = tr("The file is larger than 16 MiB");
+        *reason = HotkeysFile::tr("The file is larger than 16 MiB");
         return false;
     }
     QFile file(path);
@@ -192,11 +193,11 @@ bool readHotkeysFile(const QString& path, QByteArray* bytes, QString* reason)
         return false;
     }
     if (bytes->size() > largestHotkeysFile) {
-        *reason = tr("The file is larger than 16 MiB");
+        *reason = HotkeysFile::tr("The file is larger than 16 MiB");
         return false;
     }
     if (bytes->contains('\0')) {
-        *reason = tr("The file holds NUL bytes");
+        *reason = HotkeysFile::tr("The file holds NUL bytes");
         return false;
     }
     return true;
@@ -205,7 +206,7 @@ bool readHotkeysFile(const QString& path, QByteArray* bytes, QString* reason)
 bool writeFileSafely(const QString& path, const QByteArray& bytes, QString* reason)
 {
     if (path.isEmpty()) {
-        *reason = tr("No file name");
+        *reason = HotkeysFile::tr("No file name");
         return false;
     }
     const QString target = finalTarget(path);

@@ -16,10 +16,11 @@ namespace {
 
 const QString disableValue = QStringLiteral("Disable");
 
-QString tr(const char* text)
+// Its messages, translated in a context of their own.
+struct HotkeysFile
 {
-    return QCoreApplication::translate("HotkeysFile", text);
-}
+    Q_DECLARE_TR_FUNCTIONS(HotkeysFile)
+};
 
 const QHash<QString, int>& functionIndex()
 {
@@ -84,11 +85,13 @@ QString unwritable(const QString& storedKey, const QByteArray& key, bool keyFrom
     static const QRegularExpression placeholder(QStringLiteral("^None[0-9]+$"));
     if (!keyFromFile &&
         !(placeholder.match(storedKey).hasMatch() ? isWritableFileKey(key) : readsBackAsWritten(storedKey)))
-        return tr("The key \"%1\" cannot be written to a hotkeys file").arg(QString::fromLocal8Bit(key));
+        return HotkeysFile::tr("The key \"%1\" cannot be written to a hotkeys file")
+            .arg(QString::fromLocal8Bit(key));
     const auto isBlank = [](char c) { return c == ' ' || c == '\t'; };
     if (value.contains('\n') || value.contains('\r') || value.contains('\0') ||
         (!value.isEmpty() && (isBlank(value.front()) || isBlank(value.back()))))
-        return tr("The action \"%1\" cannot be written to a hotkeys file").arg(QString::fromLocal8Bit(value));
+        return HotkeysFile::tr("The action \"%1\" cannot be written to a hotkeys file")
+            .arg(QString::fromLocal8Bit(value));
     return QString();
 }
 
@@ -129,7 +132,7 @@ bool HotkeysModel::load(const QString& path, const QString& systemPath, QString*
         return fail(systemPath, *reason);
     bool systemFailed = false;
     if (!loadBytes(bytes, systemBytes, !systemPath.isEmpty(), &systemFailed))
-        return fail(systemFailed ? systemPath : path, tr("No [ShortCutKeys] section"));
+        return fail(systemFailed ? systemPath : path, HotkeysFile::tr("No [ShortCutKeys] section"));
     return true;
 }
 

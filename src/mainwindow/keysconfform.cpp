@@ -1,6 +1,7 @@
 #include "keysconfform.h"
 
 #include "bindingtree.h"
+#include "handbook.h"
 #include "hotkeysfile.h"
 #include "kkeysequencewidget.h"
 #include "modelcommand.h"
@@ -149,7 +150,22 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags) : QMainWindow
     editMenu->addSeparator();
     editMenu->addAction(revertAction);
     menuBar->addMenu(editMenu);
-    menuBar->addMenu(new ZemHelpMenu(this));
+    auto* helpMenu = new ZemHelpMenu(this);
+    auto* handbookAction =
+        new QAction(QIcon::fromTheme(QStringLiteral("help-contents")), tr("Handbook"), this);
+    handbookAction->setObjectName(QStringLiteral("handbookAction"));
+    handbookAction->setShortcut(QKeySequence::HelpContents);
+    connect(handbookAction, &QAction::triggered, this, [this] {
+        auto* handbook = findChild<Handbook*>();
+        if (!handbook)
+            handbook = new Handbook(this);
+        handbook->show();
+        handbook->raise();
+        handbook->activateWindow();
+    });
+    helpMenu->insertAction(helpMenu->actions().value(0), handbookAction);
+    helpMenu->insertSeparator(helpMenu->actions().value(1));
+    menuBar->addMenu(helpMenu);
     setMenuWidget(menuBar);
 
     toolBar = new QToolBar(tr("Actions toolbar"), this);
@@ -166,6 +182,16 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags) : QMainWindow
     toolBar->addAction(editCommandAction);
     toolBar->addAction(deleteCommandAction);
     addToolBar(toolBar);
+    // Buttons that show only an icon are named for screen readers and in their tool tips.
+    for (QAction* action : toolBar->actions()) {
+        if (action->isSeparator())
+            continue;
+        QWidget* button = toolBar->widgetForAction(action);
+        const QString name = action->text().remove(QLatin1Char('&'));
+        button->setAccessibleName(name);
+        if (action != fileRestoreAction)
+            action->setToolTip(name);
+    }
 
     // The order matters: a recorded key marks the document modified before it is assigned.
     connect(fileNewAction, &QAction::triggered, this, &KeysConfForm::fileNew);

@@ -77,6 +77,8 @@ void TestStartup::exitStatus_data()
     QTest::newRow("usage, without a display too")
         << "nodisplay" << QStringList{"-h", "x"} << "" << 1
         << "Usage: zem-admin-hotkeys filepath - open/create file as hotkeys coll\n\n";
+    QTest::newRow("the version, without a display")
+        << "nodisplay" << QStringList{"--version"} << "" << 0 << "zem-admin-hotkeys 2.8.16\n";
     QTest::newRow("anything else without a display, in one line")
         << "nodisplay" << QStringList() << "" << 5 << "zem-admin-hotkeys: cannot open the X display \"\"\n";
     QTest::newRow("a missing named file, not created")
