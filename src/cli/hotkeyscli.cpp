@@ -365,9 +365,8 @@ int apply(const Options& options, QTextStream& err)
     if (options.words.size() > 2)
         return UsageError;
     const QString path = targetOf(options.words.value(1)).path;
-    const QByteArray command = "ZEMWM_UPDATE_VAL SCKeysFile " + path.toLocal8Bit() + '\n';
-    if (std::any_of(command.cbegin(), command.cend() - 1,
-                    [](char c) { return uchar(c) < 0x20 || c == 0x7f; })) {
+    const QByteArray command = reloadCommandFor(path);
+    if (command.isEmpty()) {
         err << "zem-hotkeys: " << ZemHotkeys::tr("the file name holds control characters") << '\n';
         return Failed;
     }

@@ -10,6 +10,7 @@
 #include <QKeySequence>
 #include <QRegularExpression>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstring>
 #include <fcntl.h>
@@ -158,6 +159,14 @@ QByteArray foldedKey(const QByteArray& key)
             c = char(c - 'A' + 'a');
     }
     return folded;
+}
+
+QByteArray reloadCommandFor(const QString& path)
+{
+    const QByteArray command = "ZEMWM_UPDATE_VAL SCKeysFile " + path.toLocal8Bit() + '\n';
+    const bool controls = std::any_of(command.cbegin(), command.cend() - 1,
+                                      [](char c) { return uchar(c) < 0x20 || c == 0x7f; });
+    return controls || command.size() > 4096 ? QByteArray() : command;
 }
 
 bool readHotkeysFile(const QString& path, QByteArray* bytes, QString* reason)

@@ -36,6 +36,11 @@ bool readsBackAsWritten(const QString& storedKey);
 // ASCII letters lower-cased, as the file compares keys.
 QByteArray foldedKey(const QByteArray& key);
 
+// The one line that tells the window manager to read the file again; empty when the path holds
+// control characters (a line break would start a command of its own) or the line would be
+// longer than the window manager takes.
+QByteArray reloadCommandFor(const QString& path);
+
 // Reads a whole hotkeys file; refuses anything but a regular file of at most
 // largestHotkeysFile bytes without NUL bytes, before reading it whole. On failure `reason`
 // says why, in the system's words where it has them.

@@ -267,11 +267,8 @@ void KeysConfForm::fileRestore()
 
 void KeysConfForm::fileApply()
 {
-    // The command is one line: a line break in the path would start a command of its own.
-    const QByteArray command = "ZEMWM_UPDATE_VAL SCKeysFile " + currentFile.toLocal8Bit() + '\n';
-    if (std::any_of(command.cbegin(), command.cend() - 1,
-                    [](char c) { return uchar(c) < 0x20 || c == 0x7f; }) ||
-        command.size() > 4096) {
+    const QByteArray command = reloadCommandFor(currentFile);
+    if (command.isEmpty()) {
         QMessageBox::warning(this, tr("Error"),
                              tr("The window manager cannot be told to use this file: its name holds control "
                                 "characters or is too long.\nSave it under another name."),
