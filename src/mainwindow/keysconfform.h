@@ -121,6 +121,7 @@ private:
     // After New, Open and Restore: nothing to undo, and the file counts as edited.
     void startAfresh();
     void updateRevertAction();
+    void showInKeyWidget(const QKeySequence& seq);
     void createFilter(QWidget* parent);
     void findKey(const QKeySequence& seq);
     void resetFindKey();

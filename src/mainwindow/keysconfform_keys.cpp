@@ -8,6 +8,7 @@
 #include <QMessageBox>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QSignalBlocker>
 #include <QTreeWidget>
 
 void KeysConfForm::itemSelected(QTreeWidgetItem* selected)
@@ -59,6 +60,14 @@ void KeysConfForm::capturedKey(const QKeySequence& seq)
     setKey(seq);
 }
 
+void KeysConfForm::showInKeyWidget(const QKeySequence& seq)
+{
+    // Telling the widget what it shows is no new recording: were it to report a change, the
+    // edit would be made, and recorded for undo, a second time.
+    const QSignalBlocker quiet(keyWidget);
+    keyWidget->setKeySequence(seq, KKeySequenceWidget::NoValidate);
+}
+
 void KeysConfForm::setKey(const QKeySequence& seq)
 {
     const BindingId id = bindingAt(keysTree->currentItem());
@@ -75,7 +84,7 @@ void KeysConfForm::setKey(const QKeySequence& seq)
         model.reassign(holder, id);
         bindingTree->refresh(holder);
         bindingTree->refresh(id);
-        keyWidget->setKeySequence(seq, KKeySequenceWidget::NoValidate);
+        showInKeyWidget(seq);
         recordEdit(
             tr("Reassign %1 from %2 to %3")
                 .arg(seq.toString(QKeySequence::NativeText), holderText, keysTree->currentItem()->text(0)),
@@ -85,7 +94,7 @@ void KeysConfForm::setKey(const QKeySequence& seq)
 
     model.setKey(id, key);
     bindingTree->refresh(id);
-    keyWidget->setKeySequence(seq, KKeySequenceWidget::NoValidate);
+    showInKeyWidget(seq);
     recordEdit(
         tr("Assign %1 to %2").arg(seq.toString(QKeySequence::NativeText), keysTree->currentItem()->text(0)),
         before, id);

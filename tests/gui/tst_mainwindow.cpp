@@ -12,6 +12,7 @@
 #include <QLineEdit>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QRandomGenerator>
 #include <QStatusBar>
 #include <QTreeWidget>
 #include <QTreeWidgetItemIterator>
@@ -60,6 +61,7 @@ private slots:
     void filterAndFindKey();
     void undoRedo_data();
     void undoRedo();
+    void undoRandomEdits();
 
 private:
     QTreeWidgetItem* row(const QString& name, int index = 0) const;
@@ -69,6 +71,14 @@ private:
     }
     QAction* action(const char* name) const { return form->findChild<QAction*>(QLatin1String(name)); }
     KKeySequenceWidget* keyWidget() const { return form->findChild<KKeySequenceWidget*>("keyWidget"); }
+    // Every row with its key and source, then the disabled keys.
+    QStringList state() const
+    {
+        QStringList rows = form->disabledKeyList();
+        for (QTreeWidgetItemIterator it(form->findChild<QTreeWidget*>()); *it; ++it)
+            rows << (*it)->text(0) + '|' + KeysConfForm::itemKey(*it) + '|' + (*it)->text(3);
+        return rows;
+    }
     bool saveEnabled() const
     {
         return action("fileSaveAction")->isEnabled() && action("fileApplyAction")->isEnabled();
@@ -436,12 +446,6 @@ void TestMainWindow::undoRedo()
 {
     QFETCH(QString, edit);
     QFETCH(QString, undoText);
-    const auto state = [this] {
-        QStringList rows = form->disabledKeyList();
-        for (QTreeWidgetItemIterator it(form->findChild<QTreeWidget*>()); *it; ++it)
-            rows << (*it)->text(0) + '|' + KeysConfForm::itemKey(*it) + '|' + (*it)->text(3);
-        return rows;
-    };
     ModalAnswerer answerer({edit == QLatin1String("delete") ? QMessageBox::Yes : QMessageBox::Apply});
     if (edit == QLatin1String("revert")) {
         select(QStringLiteral("ZEMWM_CLOSE"));
@@ -468,6 +472,32 @@ void TestMainWindow::undoRedo()
     QCOMPARE(state(), before);
     action("redoAction")->trigger();
     QCOMPARE(state(), after);
+}
+
+void TestMainWindow::undoRandomEdits()
+{
+    // Any sequence of edits undone to the start gives the state loaded, and redone the state
+    // reached; and nothing is left to save at the start.
+    QRandomGenerator random(20261206);
+    const QStringList names{"ZEMWM_CLOSE", "ZEMWM_KILL", "ZEMWM_LOCK", "ZEMWM_EXIT", "cmd:xclock"};
+    const QStringList keys{"Alt+F4", "Ctrl+K", "Alt+F5", "Ctrl+Alt+E", "Ctrl+Alt+X", "F9"};
+    ModalAnswerer answerer({QMessageBox::Apply});
+    const QStringList start = state();
+    for (int step = 0; step < 40; ++step) {
+        select(names.at(random.bounded(names.size())));
+        if (random.bounded(3) == 0)
+            QTest::mouseClick(form->findChild<QRadioButton*>("noKeyRadio"), Qt::LeftButton);
+        else
+            form->setKey(QKeySequence(keys.at(random.bounded(keys.size()))));
+    }
+    const QStringList end = state();
+    while (action("undoAction")->isEnabled())
+        action("undoAction")->trigger();
+    QCOMPARE(state(), start);
+    QVERIFY(!KeysConfForm::isModified());
+    while (action("redoAction")->isEnabled())
+        action("redoAction")->trigger();
+    QCOMPARE(state(), end);
 }
 
 ZEM_TEST_MAIN(TestMainWindow)
