@@ -898,7 +898,9 @@
     <message numerus="yes">
         <source>%1 stays with the row that holds it now.</source>
         <translation>
-            <numerusform>%1 bleibt bei der Zeile, die es jetzt hat.</numerusform><numerusform>%1 bleiben bei den Zeilen, die sie jetzt haben.</numerusform></translation>
+            <numerusform>%1 bleibt bei der Zeile, die es jetzt hat.</numerusform>
+            <numerusform>%1 bleiben bei den Zeilen, die sie jetzt haben.</numerusform>
+        </translation>
     </message>
     <message>
         <source>Save ?</source>
@@ -998,7 +1000,9 @@ Nach einem Neustart verwendet zem-wm „%2“.</translation>
         <source>%1 of %n bindings</source>
         <extracomment>Shown while a filter is active, for example "3 of 186 bindings".</extracomment>
         <translation>
-            <numerusform>%1 von %n Kürzel</numerusform><numerusform>%1 von %n Kürzeln</numerusform></translation>
+            <numerusform>%1 von %n Kürzel</numerusform>
+            <numerusform>%1 von %n Kürzeln</numerusform>
+        </translation>
     </message>
     <message>
         <source>%1 is disabled</source>
@@ -1217,6 +1221,10 @@ Mit Ihren Änderungen überschreiben, neu laden und Ihre Änderungen verwerfen, 
     <message>
         <source>the X display refused the command</source>
         <translation>der X-Bildschirm hat den Befehl abgelehnt</translation>
+    </message>
+    <message>
+        <source>--file needs a file name</source>
+        <translation>--file braucht einen Dateinamen</translation>
     </message>
 </context>
 <context>

@@ -898,7 +898,9 @@
     <message numerus="yes">
         <source>%1 stays with the row that holds it now.</source>
         <translation>
-            <numerusform>%1 se queda en la fila que lo tiene ahora.</numerusform><numerusform>%1 se quedan en las filas que los tienen ahora.</numerusform></translation>
+            <numerusform>%1 se queda en la fila que lo tiene ahora.</numerusform>
+            <numerusform>%1 se quedan en las filas que los tienen ahora.</numerusform>
+        </translation>
     </message>
     <message>
         <source>Save ?</source>
@@ -998,7 +1000,9 @@ Tras reiniciar, zem-wm usará «%2».</translation>
         <source>%1 of %n bindings</source>
         <extracomment>Shown while a filter is active, for example "3 of 186 bindings".</extracomment>
         <translation>
-            <numerusform>%1 de %n atajo</numerusform><numerusform>%1 de %n atajos</numerusform></translation>
+            <numerusform>%1 de %n atajo</numerusform>
+            <numerusform>%1 de %n atajos</numerusform>
+        </translation>
     </message>
     <message>
         <source>%1 is disabled</source>
@@ -1217,6 +1221,10 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
     <message>
         <source>the X display refused the command</source>
         <translation>la pantalla X rechazó la orden</translation>
+    </message>
+    <message>
+        <source>--file needs a file name</source>
+        <translation>--file necesita un nombre de archivo</translation>
     </message>
 </context>
 <context>

@@ -898,7 +898,9 @@
     <message numerus="yes">
         <source>%1 stays with the row that holds it now.</source>
         <translation>
-            <numerusform>%1 reste à la ligne qui l’utilise maintenant.</numerusform><numerusform>%1 restent aux lignes qui les utilisent maintenant.</numerusform></translation>
+            <numerusform>%1 reste à la ligne qui l’utilise maintenant.</numerusform>
+            <numerusform>%1 restent aux lignes qui les utilisent maintenant.</numerusform>
+        </translation>
     </message>
     <message>
         <source>Save ?</source>
@@ -998,7 +1000,9 @@ Après un redémarrage, zem-wm utilisera « %2 ».</translation>
         <source>%1 of %n bindings</source>
         <extracomment>Shown while a filter is active, for example "3 of 186 bindings".</extracomment>
         <translation>
-            <numerusform>%1 sur %n raccourci</numerusform><numerusform>%1 sur %n raccourcis</numerusform></translation>
+            <numerusform>%1 sur %n raccourci</numerusform>
+            <numerusform>%1 sur %n raccourcis</numerusform>
+        </translation>
     </message>
     <message>
         <source>%1 is disabled</source>
@@ -1217,6 +1221,10 @@ L’écraser avec vos modifications, le recharger en les abandonnant, ou annuler
     <message>
         <source>the X display refused the command</source>
         <translation>l’écran X a refusé la commande</translation>
+    </message>
+    <message>
+        <source>--file needs a file name</source>
+        <translation>--file demande un nom de fichier</translation>
     </message>
 </context>
 <context>

@@ -898,7 +898,10 @@
     <message numerus="yes">
         <source>%1 stays with the row that holds it now.</source>
         <translation>
-            <numerusform>%1 остаётся у строки, которая его сейчас занимает.</numerusform><numerusform>%1 остаются у строк, которые их сейчас занимают.</numerusform><numerusform>%1 остаются у строк, которые их сейчас занимают.</numerusform></translation>
+            <numerusform>%1 остаётся у строки, которая его сейчас занимает.</numerusform>
+            <numerusform>%1 остаются у строк, которые их сейчас занимают.</numerusform>
+            <numerusform>%1 остаются у строк, которые их сейчас занимают.</numerusform>
+        </translation>
     </message>
     <message>
         <source>Save ?</source>
@@ -998,7 +1001,10 @@ After restart zem-wm will use "%2".</source>
         <source>%1 of %n bindings</source>
         <extracomment>Shown while a filter is active, for example "3 of 186 bindings".</extracomment>
         <translation>
-            <numerusform>%1 из %n сочетания</numerusform><numerusform>%1 из %n сочетаний</numerusform><numerusform>%1 из %n сочетаний</numerusform></translation>
+            <numerusform>%1 из %n сочетания</numerusform>
+            <numerusform>%1 из %n сочетаний</numerusform>
+            <numerusform>%1 из %n сочетаний</numerusform>
+        </translation>
     </message>
     <message>
         <source>%1 is disabled</source>
@@ -1217,6 +1223,10 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
     <message>
         <source>the X display refused the command</source>
         <translation>X-дисплей отклонил команду</translation>
+    </message>
+    <message>
+        <source>--file needs a file name</source>
+        <translation>для --file нужно имя файла</translation>
     </message>
 </context>
 <context>

@@ -53,25 +53,30 @@ Options parse(const QStringList& arguments)
     Options options;
     for (int i = 0; i < arguments.size(); ++i) {
         const QString& argument = arguments.at(i);
-        if (argument == QLatin1String("--json"))
-            options.json = true;
-        else if (argument == QLatin1String("--force"))
-            options.force = true;
-        else if (argument == QLatin1String("--help") || argument == QLatin1String("-h"))
-            options.help = true;
-        else if (argument == QLatin1String("--version"))
-            options.version = true;
-        else if (argument.startsWith(QLatin1String("--file=")))
-            options.file = argument.mid(7);
-        else if (argument == QLatin1String("--file") && i + 1 < arguments.size())
-            options.file = arguments.at(++i);
-        else if (argument == QLatin1String("--")) {
+        if (argument == QLatin1String("--")) {
             options.words << arguments.mid(i + 1);
             break;
-        } else if (argument.startsWith(QLatin1Char('-')) && argument.size() > 1)
+        }
+        if (argument == QLatin1String("--json")) {
+            options.json = true;
+        } else if (argument == QLatin1String("--force")) {
+            options.force = true;
+        } else if (argument == QLatin1String("--help") || argument == QLatin1String("-h")) {
+            options.help = true;
+        } else if (argument == QLatin1String("--version")) {
+            options.version = true;
+        } else if (argument.startsWith(QLatin1String("--file="))) {
+            options.file = argument.mid(7);
+        } else if (argument == QLatin1String("--file")) {
+            if (i + 1 < arguments.size())
+                options.file = arguments.at(++i);
+            else
+                options.error = ZemHotkeys::tr("--file needs a file name");
+        } else if (argument.startsWith(QLatin1Char('-')) && argument.size() > 1) {
             options.error = ZemHotkeys::tr("unknown option %1").arg(argument);
-        else
+        } else {
             options.words << argument;
+        }
     }
     return options;
 }

@@ -15,7 +15,6 @@
 #include <QUndoStack>
 #include <QX11Info>
 
-#include <algorithm>
 #include <cstdio>
 
 void KeysConfForm::updateTitle()
