@@ -7,6 +7,7 @@
 // for the given size and for twice that size, so that the growth can be read off.
 #include "functioncatalogue.h"
 #include "hotkeysfile.h"
+#include "keyforms.h"
 #include "hotkeysmodel.h"
 #include "keysconfform.h"
 

@@ -5,8 +5,13 @@
 #include <QString>
 #include <QStringList>
 
+#include <algorithm>
+#include <iterator>
+
 #include <X11/XF86keysym.h>
 #include <X11/Xlib.h>
+#include <X11/keysym.h>
+#include <xkbcommon/xkbcommon.h>
 
 namespace {
 
@@ -52,6 +57,17 @@ KeySym keysymFromName(const QString& name)
     return sym;
 }
 
+// Keypad keys the KF5 key server folds into their main-keyboard twins, which the window manager
+// tells apart: its table knows no keypad "=".
+struct KeypadKey
+{
+    int keyQt;
+    KeySym sym;
+};
+constexpr KeypadKey keypadOnly[] = {
+    {Qt::Key_Equal, XK_KP_Equal},
+};
+
 } // namespace
 
 QString ZemKeyServer::KeyQtToKeyStringX(int keyQt)
@@ -63,6 +79,8 @@ QString ZemKeyServer::KeyQtToKeyStringX(int keyQt)
     const char* keyName = nullptr;
     if (key == Qt::Key_Calculator) {
         keyName = "XF86Calculator";
+    } else if (const quint32 keypad = (keyQt & Qt::KeypadModifier) ? keysymOfKeyQt(keyQt) : 0) {
+        keyName = XKeysymToString(KeySym(keypad));
     } else {
         int sym = 0;
         if (!KKeyServer::keyQtToSymX(keyQt, &sym) || sym == 0)
@@ -96,10 +114,58 @@ QString ZemKeyServer::KeyStringXToQt(const QString& keyString)
     if (sym == NoSymbol)
         return QString();
     int keyQt = 0;
-    if (!KKeyServer::symXModXToKeyQt(uint32_t(sym), 0, &keyQt))
+    const auto keypad = std::find_if(std::begin(keypadOnly), std::end(keypadOnly),
+                                     [&](const KeypadKey& k) { return k.sym == sym; });
+    if (keypad != std::end(keypadOnly))
+        keyQt = keypad->keyQt | Qt::KeypadModifier;
+    else if (!KKeyServer::symXModXToKeyQt(uint32_t(sym), 0, &keyQt))
         return QString();
     const int key = keyQt & ~int(Qt::KeyboardModifierMask);
     if (key == 0 || key == Qt::Key_unknown)
         return QString();
     return QKeySequence(keyQt | modifiers).toString(QKeySequence::PortableText);
+}
+
+quint32 ZemKeyServer::keysymOfNameNoCase(const QByteArray& name)
+{
+    if (name.isEmpty())
+        return 0;
+    return xkb_keysym_from_name(name.constData(), XKB_KEYSYM_CASE_INSENSITIVE);
+}
+
+quint32 ZemKeyServer::keysymOfName(const QByteArray& name)
+{
+    if (name.isEmpty())
+        return 0;
+    const xkb_keysym_t exact = xkb_keysym_from_name(name.constData(), XKB_KEYSYM_NO_FLAGS);
+    return exact != XKB_KEY_NoSymbol ? exact : keysymOfNameNoCase(name);
+}
+
+QByteArray ZemKeyServer::nameOfKeysym(quint32 keysym)
+{
+    // Xlib's names are the ones the window manager reads back.
+    const char* name = keysym ? XKeysymToString(KeySym(keysym)) : nullptr;
+    return name ? QByteArray(name) : QByteArray();
+}
+
+quint32 ZemKeyServer::keysymOfKeyQt(int keyQt)
+{
+    const int key = keyQt & ~int(Qt::KeyboardModifierMask);
+    if (keyQt & Qt::KeypadModifier) {
+        for (const KeypadKey& k : keypadOnly) {
+            if (k.keyQt == key)
+                return quint32(k.sym);
+        }
+    }
+    if (key == Qt::Key_Calculator)
+        return XF86XK_Calculator;
+    int sym = 0;
+    if (!KKeyServer::keyQtToSymX(key | (keyQt & Qt::KeypadModifier), &sym))
+        return 0;
+    return quint32(sym);
+}
+
+quint32 ZemKeyServer::keysymOfCharacter(uint ucs4)
+{
+    return xkb_utf32_to_keysym(ucs4);
 }

@@ -1,4 +1,5 @@
 #include "hotkeysfile.h"
+#include "safefile.h"
 #include "keysconfform.h"
 #include "myapplication.h"
 #include "startup.h"

@@ -3,7 +3,10 @@
 #include "bindingfilter.h"
 #include "functioncatalogue.h"
 #include "hotkeysdocument.h"
+#include "hotkeysentries.h"
 #include "hotkeysfile.h"
+#include "safefile.h"
+#include "keyforms.h"
 #include "hotkeyslines.h"
 #include "hotkeysmodel.h"
 #include "zemwmcommand.h"
@@ -67,6 +70,8 @@ Options parse(const QStringList& arguments)
             options.version = true;
         } else if (argument.startsWith(QLatin1String("--file="))) {
             options.file = argument.mid(7);
+            if (options.file.isEmpty())
+                options.error = ZemHotkeys::tr("--file needs a file name");
         } else if (argument == QLatin1String("--file")) {
             if (i + 1 < arguments.size())
                 options.file = arguments.at(++i);
@@ -118,13 +123,24 @@ bool load(HotkeysModel& model, const Target& target, QTextStream& err)
         const QString systemPath = systemHotkeysFilePath();
         if (readHotkeysFile(systemPath, &system, &reason) && model.loadBytes(emptyHotkeysFile, system, true))
             return true;
-        err << "zem-hotkeys: " << systemPath << ": "
+        err << "zem-hotkeys: " << printableText(systemPath) << ": "
             << (reason.isEmpty() ? ZemHotkeys::tr("no [ShortCutKeys] section") : reason) << '\n';
         return false;
     }
     if (model.load(target.path, target.userFile ? systemHotkeysFilePath() : QString(), &failed, &reason))
         return true;
-    err << "zem-hotkeys: " << failed << ": " << reason << '\n';
+    err << "zem-hotkeys: " << printableText(failed) << ": " << reason << '\n';
+    return false;
+}
+
+// Every read-modify-write holds the lock from before the file is read until it is replaced,
+// so that a writer beside it can neither lose this change nor have its own lost.
+bool lockFor(DirectoryLock& lock, const Target& target, QTextStream& err)
+{
+    QString reason;
+    if (lock.lock(target.path, &reason))
+        return true;
+    err << "zem-hotkeys: " << printableText(target.path) << ": " << reason << '\n';
     return false;
 }
 
@@ -134,15 +150,15 @@ bool save(HotkeysModel& model, const Target& target, QTextStream& err)
     QString reason;
     if (model.toBytes(target.userFile, &bytes, &reason) && writeFileSafely(target.path, bytes, &reason))
         return true;
-    err << "zem-hotkeys: " << target.path << ": " << reason << '\n';
+    err << "zem-hotkeys: " << printableText(target.path) << ": " << reason << '\n';
     return false;
 }
 
-QString readKey(const QString& text, QTextStream& err)
+QByteArray readKey(const QString& text, QTextStream& err)
 {
-    const QString key = keyFromUserText(text);
+    const QByteArray key = fileKeyFromTyped(text);
     if (key.isEmpty())
-        err << "zem-hotkeys: " << ZemHotkeys::tr("cannot read the key \"%1\"").arg(text) << '\n';
+        err << "zem-hotkeys: " << ZemHotkeys::tr("cannot read the key \"%1\"").arg(printableText(text)) << '\n';
     return key;
 }
 
@@ -162,10 +178,10 @@ int list(const Options& options, QTextStream& out, QTextStream& err)
     const auto add = [&](const QString& key, const QString& function, const QString& command,
                          const QString& action, const QString& source) {
         if (!options.json) {
-            out << key << '\t'
-                << (!function.isEmpty()  ? function
-                    : !command.isEmpty() ? command
-                                         : action)
+            out << printableText(key) << '\t'
+                << printableText(!function.isEmpty()  ? function
+                                 : !command.isEmpty() ? command
+                                                      : action)
                 << '\t' << source << '\n';
             return;
         }
@@ -242,38 +258,44 @@ void checkFile(const QString& path, QVector<Finding>& findings)
 {
     QByteArray bytes;
     QString reason;
-    HotkeysDocument document;
+    HotkeysEntries file;
     if (!readHotkeysFile(path, &bytes, &reason)) {
         findings.append({path, 0, true, reason});
         return;
     }
-    if (!document.load(bytes)) {
+    if (!file.read(bytes)) {
         findings.append({path, 0, true, ZemHotkeys::tr("no [ShortCutKeys] section")});
         return;
     }
-    const HotkeysLines lines(bytes);
-    QHash<QByteArray, int> seen;
-    for (const HotkeysLine& line : lines.lines()) {
-        if (line.kind != HotkeysLine::Entry || !lines.isHotkeysSection(line.section))
+    const QVector<HotkeysLine>& lines = file.lines().lines();
+    // Lines of a key that another line of the same key overrides, and the line that counts.
+    QHash<int, int> overridden;
+    for (const KeyEntry& entry : file.entries()) {
+        for (int line : entry.others)
+            overridden.insert(line, entry.counting >= 0 ? lines.at(entry.counting).number : 0);
+    }
+    for (int i = 0; i < lines.size(); ++i) {
+        const HotkeysLine& line = lines.at(i);
+        if (line.kind != HotkeysLine::Entry || !file.lines().isHotkeysSection(line.section))
             continue;
-        const QString key = QString::fromLocal8Bit(line.key);
+        const QString key = printableText(QString::fromLocal8Bit(line.key));
         const QString value = unquoted(QString::fromLocal8Bit(line.value));
         const auto say = [&](bool error, const QString& text) {
             findings.append({path, line.number, error, text});
         };
         bool readable = true;
-        const QString stored = fromFileKey(key, &readable);
+        const QString stored = fromFileKey(QString::fromLocal8Bit(line.key), &readable);
         if (!readable)
             say(true, ZemHotkeys::tr("the key %1 cannot be read").arg(key));
-        if (const int earlier = seen.value(foldedKey(line.key)))
-            say(false,
-                ZemHotkeys::tr("the key %1 is on line %2 too; only this line counts").arg(key).arg(earlier));
-        seen.insert(foldedKey(line.key), line.number);
+        if (overridden.contains(i))
+            say(false, ZemHotkeys::tr("the key %1 does not count: line %2 binds the same key")
+                           .arg(key)
+                           .arg(overridden.value(i)));
         if (value.startsWith(QLatin1String("ZEMWM_"))) {
             if (!HotkeysModel::functionNames().contains(value))
-                say(true, ZemHotkeys::tr("%1 is no function of the window manager").arg(value));
+                say(true, ZemHotkeys::tr("%1 is no function of the window manager").arg(printableText(value)));
         } else if (value != QLatin1String("Disable") && !programExists(value)) {
-            say(false, ZemHotkeys::tr("the program of \"%1\" is not installed").arg(value));
+            say(false, ZemHotkeys::tr("the program of \"%1\" is not installed").arg(printableText(value)));
         }
         if (readable && value != QLatin1String("Disable") && swallowsTyping(stored))
             say(false, ZemHotkeys::tr("the key %1 alone takes a character from typing").arg(key));
@@ -297,7 +319,8 @@ int check(const Options& options, QTextStream& out)
                                        {"severity", severity},
                                        {"message", finding.text}});
         else
-            out << finding.path << ':' << finding.line << ": " << severity << ": " << finding.text << '\n';
+            out << printableText(finding.path) << ':' << finding.line << ": " << severity << ": " << finding.text
+                << '\n';
     }
     if (options.json)
         out << QJsonDocument(entries).toJson(QJsonDocument::Indented);
@@ -310,36 +333,50 @@ int set(const Options& options, QTextStream& out, QTextStream& err)
 {
     if (options.words.size() != 3)
         return UsageError;
-    const QString key = readKey(options.words.at(1), err);
-    const QString target = options.words.at(2).simplified();
+    const QByteArray key = readKey(options.words.at(1), err);
+    // Blanks at the ends go; anything else of the command is the user's, and a control
+    // character is refused below, never folded into a blank.
+    QString target = options.words.at(2);
+    while (target.startsWith(QLatin1Char(' ')))
+        target.remove(0, 1);
+    while (target.endsWith(QLatin1Char(' ')))
+        target.chop(1);
     if (key.isEmpty())
         return Failed;
     const bool function = target.startsWith(QLatin1String("ZEMWM_"));
     if (function && !HotkeysModel::functionNames().contains(target)) {
-        err << "zem-hotkeys: " << ZemHotkeys::tr("%1 is no function of the window manager").arg(target)
-            << '\n';
+        err << "zem-hotkeys: "
+            << ZemHotkeys::tr("%1 is no function of the window manager").arg(printableText(target)) << '\n';
         return Failed;
+    }
+    if (!function) {
+        const QString problem = commandProblem(target);
+        if (!problem.isEmpty()) {
+            err << "zem-hotkeys: " << problem << '\n';
+            return Failed;
+        }
     }
     HotkeysModel model;
     const Target file = targetOf(options.file);
-    if (!load(model, file, err))
+    DirectoryLock lock;
+    if (!lockFor(lock, file, err) || !load(model, file, err))
         return Failed;
-    if (const Binding* holder = model.find(model.holderOf(key))) {
+    if (const Binding* holder = model.find(model.holderOfFileKey(key))) {
         if (describe(*holder) == target) {
-            out << ZemHotkeys::tr("%1 already does %2").arg(options.words.at(1), target) << '\n';
+            out << ZemHotkeys::tr("%1 already does %2").arg(options.words.at(1), printableText(target)) << '\n';
             return 0;
         }
         if (!options.force) {
             err << "zem-hotkeys: "
                 << ZemHotkeys::tr("%1 is held by %2; --force takes it over")
-                       .arg(options.words.at(1), describe(*holder))
+                       .arg(options.words.at(1), printableText(describe(*holder)))
                 << '\n';
             return KeyTaken;
         }
         model.clearKey(holder->id);
     }
     const BindingId row = function ? model.rowForFunction(target) : model.addCommand(target);
-    model.setKey(row, key);
+    model.setFileKey(row, key);
     return save(model, file, err) ? 0 : Failed;
 }
 
@@ -347,16 +384,18 @@ int unset(const Options& options, QTextStream& err)
 {
     if (options.words.size() != 2)
         return UsageError;
-    const QString key = readKey(options.words.at(1), err);
+    const QByteArray key = readKey(options.words.at(1), err);
     if (key.isEmpty())
         return Failed;
     HotkeysModel model;
     const Target file = targetOf(options.file);
-    if (!load(model, file, err))
+    DirectoryLock lock;
+    if (!lockFor(lock, file, err) || !load(model, file, err))
         return Failed;
-    const Binding* holder = model.find(model.holderOf(key));
+    const Binding* holder = model.find(model.holderOfFileKey(key));
     if (!holder) {
-        err << "zem-hotkeys: " << ZemHotkeys::tr("no binding holds %1").arg(options.words.at(1)) << '\n';
+        err << "zem-hotkeys: " << ZemHotkeys::tr("no binding holds %1").arg(printableText(options.words.at(1)))
+            << '\n';
         return Failed;
     }
     // A function's only row stays, without its key; any other row goes.
@@ -370,9 +409,18 @@ int apply(const Options& options, QTextStream& err)
     if (options.words.size() > 2)
         return UsageError;
     const QString path = targetOf(options.words.value(1)).path;
-    const QByteArray command = reloadCommandFor(path);
+    QString reason;
+    const QByteArray command = reloadCommandFor(path, &reason);
     if (command.isEmpty()) {
-        err << "zem-hotkeys: " << ZemHotkeys::tr("the file name holds control characters") << '\n';
+        err << "zem-hotkeys: " << printableText(path) << ": " << reason << '\n';
+        return Failed;
+    }
+    // The window manager is told only of a file it can read.
+    QByteArray bytes;
+    HotkeysDocument document;
+    if (!readHotkeysFile(path, &bytes, &reason) ||
+        (!document.load(bytes) && !(reason = ZemHotkeys::tr("no [ShortCutKeys] section")).isEmpty())) {
+        err << "zem-hotkeys: " << printableText(path) << ": " << reason << '\n';
         return Failed;
     }
     Display* display = XOpenDisplay(nullptr);

@@ -2,12 +2,6 @@
 
 #include <QString>
 
-// Reads a key combination the way a user may type it: the shown form with the modifiers in any
-// order ("alt+ctrl+t"), the file form ("Ctrl|Alt|t", "None|F5"), X key names ("space",
-// "XF86AudioMute"), and "Super" or "Win" for Meta. Gives QKeySequence portable text, or an
-// empty string when the text is no key combination.
-QString keyFromUserText(const QString& text);
-
 // Which binding rows a filter text shows: those whose action, function name, command or shown
 // key holds the text, ignoring case, and those whose key is the combination the text reads as.
 class BindingFilter

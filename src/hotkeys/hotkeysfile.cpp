@@ -1,21 +1,15 @@
 #include "hotkeysfile.h"
 
 #include "zemcore.h"
-#include "zemkeyserver.h"
 
 #include <QCoreApplication>
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
-#include <QKeySequence>
-#include <QRegularExpression>
 
 #include <algorithm>
 #include <cerrno>
 #include <cstring>
-#include <fcntl.h>
-#include <sys/stat.h>
-#include <unistd.h>
 
 namespace {
 
@@ -36,41 +30,6 @@ struct HotkeysFile
     Q_DECLARE_TR_FUNCTIONS(HotkeysFile)
 };
 
-// The file a path finally names, following symbolic links, so that saving through a link
-// replaces the file behind it and the link stays.
-QString finalTarget(const QString& path)
-{
-    QString target = path;
-    for (int hops = 0; hops < 40; ++hops) {
-        const QFileInfo info(target);
-        if (!info.isSymLink())
-            break;
-        target = info.symLinkTarget();
-    }
-    return target;
-}
-
-bool writeAll(int fd, const QByteArray& bytes)
-{
-    const char* data = bytes.constData();
-    qint64 left = bytes.size();
-    while (left > 0) {
-        const ssize_t written = ::write(fd, data, size_t(left));
-        if (written < 0) {
-            if (errno == EINTR)
-                continue;
-            return false;
-        }
-        if (written == 0) {
-            errno = ENOSPC;
-            return false;
-        }
-        data += written;
-        left -= written;
-    }
-    return true;
-}
-
 } // namespace
 
 QString userHotkeysFilePath()
@@ -83,90 +42,66 @@ QString systemHotkeysFilePath()
     return hotkeysFileIn(ZEM_SYSTEM_CONFIG_DIR);
 }
 
-QString toFileKey(const QString& keyString)
+namespace {
+
+bool isControl(uint c)
 {
-    QString key = keyString;
-    const int lastPlus = key.lastIndexOf(QLatin1Char('+'));
-    if (lastPlus < 0) {
-        if (key.size() == 1)
-            key = key.toLower();
-        return QLatin1String("None|") + key;
+    return c < 0x20 || (c >= 0x7f && c <= 0x9f) || c == 0x2028 || c == 0x2029;
+}
+
+} // namespace
+
+QString commandProblem(const QString& command)
+{
+    if (command.trimmed().isEmpty())
+        return HotkeysFile::tr("The command is empty");
+    for (const QChar c : command) {
+        if (isControl(c.unicode()))
+            return HotkeysFile::tr("The command holds the control character %1, which a hotkeys file "
+                                   "cannot hold")
+                .arg(printableText(QString(c)));
     }
-    const QString keyPart = key.mid(lastPlus + 1);
-    if (keyPart.size() == 1)
-        key = key.left(lastPlus + 1) + keyPart.toLower();
-    key.replace(QLatin1Char('+'), QLatin1Char('|'));
-    return key;
+    return QString();
 }
 
-QString fromFileKey(const QString& fileKey, bool* readable)
+QString printableText(const QString& text)
 {
-    static const QRegularExpression placeholder(QStringLiteral("None[0-9]+"));
-
-    QString key = unquoted(fileKey);
-    key.replace(QLatin1Char('|'), QLatin1Char('+'));
-    key.remove(QStringLiteral("None+"));
-    key.remove(placeholder);
-
-    if (readable)
-        *readable = true;
-    if (key == QLatin1String("XF86Calculator"))
-        return QStringLiteral("Calculator");
-    const QString converted = ZemKeyServer::KeyStringXToQt(key);
-    if (readable)
-        *readable = key.isEmpty() || !converted.isEmpty();
-    return converted.isEmpty() ? key : converted;
-}
-
-QString fileKeyOf(const QString& storedKey)
-{
-    const QKeySequence sequence = QKeySequence::fromString(storedKey, QKeySequence::NativeText);
-    QString keyString = ZemKeyServer::KeyQtToKeyStringX(sequence.isEmpty() ? 0 : sequence[0]);
-    if (keyString.isEmpty())
-        keyString = storedKey;
-    return toFileKey(keyString);
-}
-
-QString unquoted(const QString& text)
-{
-    const QLatin1Char quote('"');
-    if (text.size() >= 2 && text.startsWith(quote) && text.endsWith(quote))
-        return text.mid(1, text.size() - 2);
-    return text;
-}
-
-bool isWritableFileKey(const QByteArray& key)
-{
-    const auto isBlank = [](char c) { return c == ' ' || c == '\t'; };
-    return !key.isEmpty() && !key.contains('\n') && !key.contains('\r') && !key.contains('\0') &&
-           !key.contains('=') && !isBlank(key.front()) && !isBlank(key.back()) &&
-           !QByteArray(";#[\"").contains(key.front());
-}
-
-bool readsBackAsWritten(const QString& storedKey)
-{
-    const QByteArray written = fileKeyOf(storedKey).toLocal8Bit();
-    return isWritableFileKey(written) &&
-           foldedKey(fileKeyOf(fromFileKey(QString::fromLocal8Bit(written))).toLocal8Bit()) ==
-               foldedKey(written);
-}
-
-QByteArray foldedKey(const QByteArray& key)
-{
-    QByteArray folded = key;
-    for (char& c : folded) {
-        if (c >= 'A' && c <= 'Z')
-            c = char(c - 'A' + 'a');
+    QString result;
+    result.reserve(text.size());
+    for (const QChar c : text) {
+        const uint code = c.unicode();
+        if (!isControl(code))
+            result += c;
+        else if (code < 0x80)
+            result += QStringLiteral("\\x%1").arg(code, 2, 16, QLatin1Char('0'));
+        else
+            result += QStringLiteral("\\u{%1}").arg(code, 4, 16, QLatin1Char('0'));
     }
-    return folded;
+    return result;
 }
 
-QByteArray reloadCommandFor(const QString& path)
+QByteArray reloadCommandFor(const QString& path, QString* reason)
 {
-    const QByteArray command = "ZEMWM_UPDATE_VAL SCKeysFile " + path.toLocal8Bit() + '\n';
-    const bool controls = std::any_of(command.cbegin(), command.cend() - 1,
-                                      [](char c) { return uchar(c) < 0x20 || c == 0x7f; });
-    return controls || command.size() > 4096 ? QByteArray() : command;
+    const QByteArray name = QFile::encodeName(path);
+    const QByteArray command = "ZEMWM_UPDATE_VAL SCKeysFile " + name + '\n';
+    if (std::any_of(name.cbegin(), name.cend(), [](char c) { return uchar(c) < 0x20 || c == 0x7f; })) {
+        *reason = HotkeysFile::tr("The file name holds control characters");
+        return QByteArray();
+    }
+    if (QFile::decodeName(name) != path) {
+        *reason = HotkeysFile::tr("The file name cannot be written in the locale's encoding");
+        return QByteArray();
+    }
+    if (command.size() > 4096) {
+        *reason = HotkeysFile::tr("The file name is too long to be handed to the window manager");
+        return QByteArray();
+    }
+    return command;
+}
+
+bool isFaithfulFileName(const QByteArray& name)
+{
+    return QFile::encodeName(QFile::decodeName(name)) == name;
 }
 
 bool readHotkeysFile(const QString& path, QByteArray* bytes, QString* reason)
@@ -208,63 +143,6 @@ bool readHotkeysFile(const QString& path, QByteArray* bytes, QString* reason)
     if (bytes->contains('\0')) {
         *reason = HotkeysFile::tr("The file holds NUL bytes");
         return false;
-    }
-    return true;
-}
-
-bool writeFileSafely(const QString& path, const QByteArray& bytes, QString* reason)
-{
-    if (path.isEmpty()) {
-        *reason = HotkeysFile::tr("No file name");
-        return false;
-    }
-    const QString target = finalTarget(path);
-    const QFileInfo targetInfo(target);
-    if (targetInfo.isDir()) {
-        *reason = systemReason(EISDIR);
-        return false;
-    }
-    QByteArray temporary =
-        QFile::encodeName(targetInfo.absolutePath() + QLatin1String("/.") + targetInfo.fileName()) +
-        ".XXXXXX";
-    const int fd = ::mkstemp(temporary.data());
-    if (fd < 0) {
-        *reason = systemReason(errno);
-        return false;
-    }
-
-    struct stat old;
-    bool ok = true;
-    if (::stat(QFile::encodeName(target).constData(), &old) == 0) {
-        ok = ::fchmod(fd, old.st_mode & 07777) == 0;
-        // Only root may give the file away; for anyone else the owner is already the same.
-        if (ok && ::fchown(fd, old.st_uid, old.st_gid) != 0 && errno != EPERM)
-            ok = false;
-    } else {
-        const mode_t mask = ::umask(0);
-        ::umask(mask);
-        ok = ::fchmod(fd, 0666 & ~mask) == 0;
-    }
-    ok = ok && writeAll(fd, bytes) && ::fsync(fd) == 0;
-    int error = ok ? 0 : errno;
-    if (::close(fd) != 0 && ok) {
-        ok = false;
-        error = errno;
-    }
-    if (ok && ::rename(temporary.constData(), QFile::encodeName(target).constData()) != 0) {
-        ok = false;
-        error = errno;
-    }
-    if (!ok) {
-        ::unlink(temporary.constData());
-        *reason = systemReason(error);
-        return false;
-    }
-    // The new name is on disk only once the directory is.
-    const int dir = ::open(QFile::encodeName(targetInfo.absolutePath()).constData(), O_RDONLY | O_DIRECTORY);
-    if (dir >= 0) {
-        ::fsync(dir);
-        ::close(dir);
     }
     return true;
 }

@@ -1,6 +1,6 @@
 #include "hotkeyslines.h"
 
-#include "hotkeysfile.h"
+#include "keyforms.h"
 
 namespace {
 
@@ -118,7 +118,9 @@ HotkeysLines::HotkeysLines(const QByteArray& bytes) : data(bytes)
         entry.key = data.mid(q, trimmedEnd(q, r) - q);
         const int valueStart = skipSpaces(r + 1, nullptr, false);
         const int eol = endOfLine(valueStart);
-        entry.value = data.mid(valueStart, trimmedEnd(valueStart, eol) - valueStart);
+        entry.valueStart = valueStart;
+        entry.valueEnd = trimmedEnd(valueStart, eol);
+        entry.value = data.mid(valueStart, entry.valueEnd - valueStart);
         entry.end = withLineEnd(eol);
         if (eol < size)
             ++line;

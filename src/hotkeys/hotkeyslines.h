@@ -17,6 +17,8 @@ struct HotkeysLine
     QByteArray name;   // sections: the name, trimmed
     QByteArray key;    // entries: key and value, trimmed as the reader trims them
     QByteArray value;
+    int valueStart = 0; // entries: where the trimmed value stands in the bytes
+    int valueEnd = 0;
 };
 
 // The bytes of a hotkeys file as lines, so that what the editor leaves alone can be written

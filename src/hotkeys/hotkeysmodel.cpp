@@ -1,9 +1,9 @@
 #include "hotkeysmodel.h"
 
 #include "functioncatalogue.h"
-#include "hotkeysdocument.h"
+#include "hotkeysentries.h"
 #include "hotkeysfile.h"
-#include "hotkeyslines.h"
+#include "keyforms.h"
 
 #include <QCoreApplication>
 #include <QHash>
@@ -34,73 +34,80 @@ const QHash<QString, int>& functionIndex()
     return index;
 }
 
-QByteArray withLineEnd(QByteArray bytes)
+const std::shared_ptr<const HotkeysEntries>& emptyFile()
 {
-    if (!bytes.isEmpty() && !bytes.endsWith('\n') && !bytes.endsWith('\r'))
-        bytes += '\n';
-    return bytes;
+    static const std::shared_ptr<const HotkeysEntries> empty = [] {
+        auto entries = std::make_shared<HotkeysEntries>();
+        entries->read(emptyHotkeysFile);
+        return entries;
+    }();
+    return empty;
 }
 
-// The line of each key that the reader takes: the last one in a [ShortCutKeys] section.
-QHash<QByteArray, int> lastLineOfKeys(const HotkeysLines& lines)
-{
-    QHash<QByteArray, int> last;
-    for (int i = 0; i < lines.lines().size(); ++i) {
-        const HotkeysLine& line = lines.lines().at(i);
-        if (line.kind == HotkeysLine::Entry && lines.isHotkeysSection(line.section))
-            last.insert(foldedKey(line.key), i);
-    }
-    return last;
-}
-
-// What an entry was read as, when the lines and the reader agree on it.
-std::shared_ptr<const EntryOrigin> originOf(const HotkeysLines& lines, const QHash<QByteArray, int>& last,
-                                            const HotkeysEntry& entry, const QString& key,
+std::shared_ptr<const EntryOrigin> originOf(const HotkeysEntries& file, const KeyEntry& entry,
                                             const QString& action, bool editedFile)
 {
-    const int i = last.value(foldedKey(entry.key), -1);
-    if (i < 0 || lines.lines().at(i).value != entry.value)
-        return nullptr;
-    const HotkeysLine& line = lines.lines().at(i);
     auto origin = std::make_shared<EntryOrigin>();
-    origin->leading = lines.span(lines.leadingStart(i), line.start);
-    // A key written twice in other letter case is read with the spelling of its first line and
-    // the value of its last; the line is then composed from the two.
-    if (line.key == entry.key)
-        origin->line = lines.span(line.start, line.end);
-    origin->rawKey = entry.key;
-    origin->rawValue = line.value;
-    origin->readKey = key;
+    origin->rawValue = entry.value;
     origin->readAction = action;
-    origin->lineNumber = line.number;
     origin->editedFile = editedFile;
+    if (entry.counting >= 0)
+        origin->lineNumber = file.lines().lines().at(entry.counting).number;
     return origin;
 }
 
-// Why a line of the editor's making would not read back as this key and value; empty when it
-// would. Keys read from a file are written as they were read and need no check; placeholders
-// are read back as no key, as they should.
-QString unwritable(const QString& storedKey, const QByteArray& key, bool keyFromFile, const QByteArray& value)
+// Where a new line goes among the section's entries: the catalogue's order of functions, then
+// commands, then disabled keys; an unknown function has no place.
+int rankOf(const QByteArray& value)
 {
-    static const QRegularExpression placeholder(QStringLiteral("^None[0-9]+$"));
-    if (!keyFromFile &&
-        !(placeholder.match(storedKey).hasMatch() ? isWritableFileKey(key) : readsBackAsWritten(storedKey)))
-        return HotkeysFile::tr("The key \"%1\" cannot be written to a hotkeys file")
-            .arg(QString::fromLocal8Bit(key));
+    const QString action = unquoted(QString::fromLocal8Bit(value));
+    const int functions = HotkeysModel::functionNames().size();
+    if (action == disableValue)
+        return functions + 1;
+    if (action.startsWith(QLatin1String("ZEMWM_")))
+        return functionIndex().value(action, -1);
+    return functions;
+}
+
+QByteArray lineEndOf(const QByteArray& line)
+{
+    if (line.endsWith("\r\n"))
+        return "\r\n";
+    if (line.endsWith('\n'))
+        return "\n";
+    if (line.endsWith('\r'))
+        return "\r";
+    return QByteArray();
+}
+
+// Why a value of the editor's making cannot stand in the file; empty when it can.
+QString unwritableValue(const QByteArray& value)
+{
     const auto isBlank = [](char c) { return c == ' ' || c == '\t'; };
     if (value.contains('\n') || value.contains('\r') || value.contains('\0') ||
         (!value.isEmpty() && (isBlank(value.front()) || isBlank(value.back()))))
         return HotkeysFile::tr("The action \"%1\" cannot be written to a hotkeys file")
-            .arg(QString::fromLocal8Bit(value));
+            .arg(printableText(QString::fromLocal8Bit(value)));
     return QString();
 }
 
+// One entry that writing wants in the file.
+struct Wanted
+{
+    QByteArray key;
+    QByteArray value;
+    int rank = -1;
+    QString keyProblem;   // why the key cannot start a new line; empty when it can
+    QString valueProblem; // why the value cannot be written; empty when it can
+};
+
 } // namespace
 
-HotkeysModel::HotkeysModel() : functionRows(functionNames().size()), sectionHeader(emptyHotkeysFile)
+HotkeysModel::HotkeysModel() : functionRows(functionNames().size()), base(emptyFile())
 {
     for (int f = 0; f < functionRows.size(); ++f)
-        functionRows[f].append(Binding{++lastId, f, QString(), QString(), BindingSource::Unset, nullptr});
+        functionRows[f].append(Binding{++lastId, f, QString(), QString(), QByteArray(), BindingSource::Unset,
+                                       nullptr, false});
 }
 
 const QStringList& HotkeysModel::functionNames()
@@ -139,11 +146,11 @@ bool HotkeysModel::load(const QString& path, const QString& systemPath, QString*
 bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBytes, bool withSystem,
                              bool* systemFailed)
 {
-    HotkeysDocument mainDocument;
-    HotkeysDocument systemDocument;
-    if (!mainDocument.load(bytes))
+    auto mainFile = std::make_shared<HotkeysEntries>();
+    HotkeysEntries systemFile;
+    if (!mainFile->read(bytes))
         return false;
-    if (withSystem && !systemDocument.load(systemBytes)) {
+    if (withSystem && !systemFile.read(systemBytes)) {
         if (systemFailed)
             *systemFailed = true;
         return false;
@@ -153,109 +160,69 @@ bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBy
     fresh.lastId = lastId;
     for (auto& rows : fresh.functionRows)
         rows.first().id = ++fresh.lastId;
+    fresh.base = mainFile;
 
-    const HotkeysLines lines(bytes);
-    const QVector<HotkeysLine>& all = lines.lines();
-    int header = -1;
-    const auto firstSection = std::find_if(
-        all.cbegin(), all.cend(), [](const HotkeysLine& line) { return line.kind == HotkeysLine::Section; });
-    if (firstSection != all.cend())
-        fresh.beforeSection =
-            withLineEnd(lines.span(lines.textStart(), lines.leadingStart(int(firstSection - all.cbegin()))));
-    for (int i = 0; i < all.size(); ++i) {
-        if (all.at(i).kind != HotkeysLine::Section)
-            continue;
-        const int runEnd = [&] {
-            for (int j = i + 1; j < all.size(); ++j) {
-                if (all.at(j).kind == HotkeysLine::Section)
-                    return lines.leadingStart(j);
-            }
-            return all.last().end;
-        }();
-        if (header < 0 && !lines.isHotkeysSection(i)) {
-            fresh.otherSections += withLineEnd(lines.span(lines.leadingStart(i), runEnd));
-        } else if (header < 0) {
-            header = i;
-            fresh.sectionHeader = lines.span(lines.leadingStart(i), all.at(i).end);
-            fresh.sectionHeader = withLineEnd(fresh.sectionHeader);
-        } else if (lines.isHotkeysSection(i)) {
-            // A second [ShortCutKeys]: its entries join the first; what stands above it stays.
-            fresh.sectionEnd += withLineEnd(lines.span(lines.leadingStart(i), all.at(i).start));
-        } else {
-            fresh.otherSections += withLineEnd(lines.span(lines.leadingStart(i), runEnd));
-        }
-    }
-    fresh.afterLast = lines.trailing();
-    if (header < 0)
-        fresh.sectionHeader = emptyHotkeysFile;
-
-    const QHash<QByteArray, int> lastLine = lastLineOfKeys(lines);
-    const HotkeysLines systemLines(systemBytes);
-    const QHash<QByteArray, int> systemLastLine = lastLineOfKeys(systemLines);
-
-    QSet<QString> boundKeys;
+    QSet<QByteArray> boundKeys;
     QHash<int, QVector<Binding>> furtherRows;
-    const auto addEntries = [&](const HotkeysDocument& document, BindingSource source) {
+    const auto addEntries = [&](const HotkeysEntries& file, BindingSource source) {
         const bool edited = source == BindingSource::User;
-        for (const HotkeysEntry& entry : document.entries()) {
+        for (const KeyEntry& entry : file.entries()) {
             const QString key = fromFileKey(QString::fromLocal8Bit(entry.key));
             const QString value = unquoted(QString::fromLocal8Bit(entry.value));
-            if (!edited && !key.isEmpty() && value != disableValue) {
+            const bool isKey = isKeyIdentity(entry.identity);
+            const QByteArray fileKey =
+                entry.counting >= 0 ? file.lines().lines().at(entry.counting).key : entry.key;
+            const auto origin = originOf(file, entry, value, edited);
+            if (!edited && isKey && value != disableValue) {
                 // Kept whether or not the user's file hides it: freeing the key brings it back.
-                fresh.systemKeys.insert(key.toLower());
+                fresh.systemKeys.insert(entry.identity);
                 const int function = functionIndex().value(value, -1);
                 if (function >= 0)
                     fresh.systemBindings[function].append(
-                        Binding{0, function, QString(), key, source,
-                                originOf(systemLines, systemLastLine, entry, key, value, false)});
+                        Binding{0, function, QString(), key, fileKey, source, origin, false});
             }
             // Whoever bound the key first keeps it: the user's file before the system one.
-            if (!key.isEmpty() && boundKeys.contains(key.toLower()))
+            if (isKey && boundKeys.contains(entry.identity))
                 continue;
-            auto origin = edited ? originOf(lines, lastLine, entry, key, value, true)
-                                 : originOf(systemLines, systemLastLine, entry, key, value, false);
 
             if (value.startsWith(QLatin1String("ZEMWM_"))) {
                 const int function = functionIndex().value(value, -1);
                 if (function < 0) {
                     // A function of a newer window manager: not shown, but never lost.
-                    if (edited && origin)
-                        fresh.kept.append({foldedKey(origin->rawKey), origin});
+                    if (edited)
+                        fresh.kept.append({fileKey, origin});
                     continue;
                 }
                 Binding& first = fresh.functionRows[function].first();
                 if (first.key.isEmpty()) {
                     first.key = key;
+                    first.fileKey = fileKey;
                     first.source = source;
                     first.origin = origin;
                 } else {
                     furtherRows[function].append(
-                        Binding{++fresh.lastId, function, QString(), key, source, origin});
+                        Binding{++fresh.lastId, function, QString(), key, fileKey, source, origin, false});
                 }
             } else if (value == disableValue) {
-                if (key.isEmpty()) {
+                if (!isKey) {
                     // A disabled placeholder switches nothing off; it is kept as it stands.
-                    if (edited && origin)
-                        fresh.kept.append({foldedKey(origin->rawKey), origin});
+                    if (edited)
+                        fresh.kept.append({fileKey, origin});
                     continue;
                 }
-                if (!fresh.isDisabled(key))
-                    fresh.disabled.append({key, origin});
+                if (!fresh.isDisabledFileKey(fileKey))
+                    fresh.disabled.append({key, fileKey, origin});
             } else {
-                fresh.commandRows.append(Binding{++fresh.lastId, -1, value, key, source, origin});
+                fresh.commandRows.append(
+                    Binding{++fresh.lastId, -1, value, key, fileKey, source, origin, false});
             }
-            if (!key.isEmpty())
-                boundKeys.insert(key.toLower());
+            if (isKey)
+                boundKeys.insert(entry.identity);
         }
     };
-    addEntries(mainDocument, BindingSource::User);
+    addEntries(*mainFile, BindingSource::User);
     if (withSystem)
-        addEntries(systemDocument, BindingSource::System);
-
-    // What is kept unseen is written back in the order of the file.
-    std::stable_sort(fresh.kept.begin(), fresh.kept.end(), [](const Kept& a, const Kept& b) {
-        return a.origin->lineNumber < b.origin->lineNumber;
-    });
+        addEntries(systemFile, BindingSource::System);
 
     // A function's further rows follow its first row, the one read last nearest to it.
     for (auto it = furtherRows.cbegin(); it != furtherRows.cend(); ++it)
@@ -310,34 +277,48 @@ QByteArray HotkeysModel::disabledFileKey(const QString& key) const
 {
     for (const DisabledKey& d : disabled) {
         if (d.key == key)
-            return writtenKey(d.key, d.origin.get());
+            return d.fileKey;
     }
     return ::fileKeyOf(key).toLocal8Bit();
 }
 
-bool HotkeysModel::isDisabled(const QString& key) const
+QByteArray HotkeysModel::fileKeyOf(const Binding& binding) const
 {
-    return std::any_of(disabled.cbegin(), disabled.cend(),
-                       [&](const DisabledKey& d) { return d.key == key; });
+    return binding.fileKey.isEmpty() && !binding.key.isEmpty() ? ::fileKeyOf(binding.key).toLocal8Bit()
+                                                               : binding.fileKey;
 }
 
-QByteArray HotkeysModel::writtenKey(const QString& key, const EntryOrigin* origin) const
+bool HotkeysModel::isDisabled(const QString& key) const
 {
-    if (origin && key == origin->readKey && !origin->rawKey.isEmpty())
-        return origin->rawKey;
-    return ::fileKeyOf(key).toLocal8Bit();
+    return !key.isEmpty() && isDisabledFileKey(::fileKeyOf(key).toLocal8Bit());
+}
+
+bool HotkeysModel::isDisabledFileKey(const QByteArray& fileKey) const
+{
+    const QByteArray identity = keyIdentity(fileKey);
+    return std::any_of(disabled.cbegin(), disabled.cend(),
+                       [&](const DisabledKey& d) { return keyIdentity(d.fileKey) == identity; });
+}
+
+const QByteArray& HotkeysModel::readBytes() const
+{
+    return base->bytes();
 }
 
 BindingId HotkeysModel::holderOf(const QString& key, BindingId except) const
 {
     if (key.isEmpty())
         return 0;
-    const QString lower = key.toLower();
-    const QByteArray fileKey = foldedKey(::fileKeyOf(key).toLocal8Bit());
+    return holderOfFileKey(::fileKeyOf(key).toLocal8Bit(), except);
+}
+
+BindingId HotkeysModel::holderOfFileKey(const QByteArray& fileKey, BindingId except) const
+{
+    if (fileKey.isEmpty())
+        return 0;
+    const QByteArray identity = keyIdentity(fileKey);
     for (const Binding* row : rows()) {
-        if (row->id == except || row->key.isEmpty())
-            continue;
-        if (row->key.toLower() == lower || foldedKey(writtenKey(row->key, row->origin.get())) == fileKey)
+        if (row->id != except && !row->key.isEmpty() && keyIdentity(fileKeyOf(*row)) == identity)
             return row->id;
     }
     return 0;
@@ -345,32 +326,47 @@ BindingId HotkeysModel::holderOf(const QString& key, BindingId except) const
 
 void HotkeysModel::keepFreedKeyOff(const Binding& row)
 {
-    if (row.key.isEmpty() || isDisabled(row.key) || holderOf(row.key, row.id))
+    if (row.key.isEmpty())
+        return;
+    const QByteArray fileKey = fileKeyOf(row);
+    if (isDisabledFileKey(fileKey) || holderOfFileKey(fileKey, row.id))
         return;
     // Otherwise the system file's binding of the key would answer to it again after saving.
-    if (row.source == BindingSource::System || systemKeys.contains(row.key.toLower()))
-        disabled.append({row.key, row.origin});
+    if (row.source == BindingSource::System || systemKeys.contains(keyIdentity(fileKey)))
+        disabled.append({row.key, fileKey, row.origin});
 }
 
-void HotkeysModel::enable(const QString& key)
+void HotkeysModel::enable(const QByteArray& fileKey)
 {
     // A combination in use again is no longer disabled.
-    disabled.erase(
-        std::remove_if(disabled.begin(), disabled.end(), [&](const DisabledKey& d) { return d.key == key; }),
-        disabled.end());
+    const QByteArray identity = keyIdentity(fileKey);
+    disabled.erase(std::remove_if(disabled.begin(), disabled.end(),
+                                  [&](const DisabledKey& d) { return keyIdentity(d.fileKey) == identity; }),
+                   disabled.end());
+}
+
+void HotkeysModel::assignKey(Binding* row, const QString& key, const QByteArray& fileKey, bool recorded)
+{
+    const Binding before = *row;
+    row->key = key;
+    row->fileKey = fileKey;
+    row->keyRecorded = recorded;
+    row->source = BindingSource::User;
+    enable(fileKey);
+    if (keyIdentity(before.fileKey) != keyIdentity(fileKey))
+        keepFreedKeyOff(before);
 }
 
 void HotkeysModel::setKey(BindingId id, const QString& key)
 {
-    Binding* row = findMutable(id);
-    if (!row)
-        return;
-    const Binding before = *row;
-    row->key = key;
-    row->source = BindingSource::User;
-    enable(key);
-    if (before.key != key)
-        keepFreedKeyOff(before);
+    if (Binding* row = findMutable(id))
+        assignKey(row, key, key.isEmpty() ? QByteArray() : ::fileKeyOf(key).toLocal8Bit(), true);
+}
+
+void HotkeysModel::setFileKey(BindingId id, const QByteArray& fileKey)
+{
+    if (Binding* row = findMutable(id))
+        assignKey(row, fromFileKey(QString::fromLocal8Bit(fileKey)), fileKey, false);
 }
 
 void HotkeysModel::clearKey(BindingId id)
@@ -380,19 +376,22 @@ void HotkeysModel::clearKey(BindingId id)
         return;
     keepFreedKeyOff(*row);
     row->key.clear();
+    row->fileKey.clear();
     row->source = BindingSource::User;
 }
 
 void HotkeysModel::reassign(BindingId holder, BindingId target)
 {
     Binding* from = findMutable(holder);
-    if (!from || !findMutable(target))
+    Binding* to = findMutable(target);
+    if (!from || !to)
         return;
-    const QString key = from->key;
+    const Binding moved = *from;
     // The key stays in use, so nothing is to be switched off for it.
     from->key.clear();
+    from->fileKey.clear();
     from->source = BindingSource::User;
-    setKey(target, key);
+    assignKey(to, moved.key, fileKeyOf(moved), moved.keyRecorded);
 }
 
 QVector<Binding> HotkeysModel::systemRowsOf(int function) const
@@ -400,7 +399,7 @@ QVector<Binding> HotkeysModel::systemRowsOf(int function) const
     const QVector<Binding> read = systemBindings.value(function);
     QVector<Binding> rows;
     for (const Binding& binding : read) {
-        const Binding* holder = find(holderOf(binding.key));
+        const Binding* holder = find(holderOfFileKey(binding.fileKey));
         if (!holder || holder->function == function)
             rows.append(binding);
     }
@@ -419,7 +418,8 @@ bool HotkeysModel::differsFromSystem(int function) const
     if (rows.size() != expected.size())
         return true;
     for (int i = 0; i < rows.size(); ++i) {
-        if (rows.at(i).source != BindingSource::System || rows.at(i).key != expected.at(i).key)
+        if (rows.at(i).source != BindingSource::System ||
+            keyIdentity(rows.at(i).fileKey) != keyIdentity(expected.at(i).fileKey))
             return true;
     }
     return false;
@@ -434,18 +434,19 @@ QStringList HotkeysModel::revertToSystem(int function)
         keepFreedKeyOff(row);
     QStringList heldElsewhere;
     for (const Binding& binding : systemBindings.value(function)) {
-        if (holderOf(binding.key)) {
+        if (holderOfFileKey(binding.fileKey)) {
             heldElsewhere << binding.key;
             continue;
         }
-        rows.append(
-            Binding{++lastId, function, QString(), binding.key, BindingSource::System, binding.origin});
-        enable(binding.key);
+        rows.append(Binding{++lastId, function, QString(), binding.key, binding.fileKey, BindingSource::System,
+                            binding.origin, false});
+        enable(binding.fileKey);
     }
     if (rows.size() > 2)
         std::reverse(rows.begin() + 1, rows.end());
     if (rows.isEmpty())
-        rows.append(Binding{++lastId, function, QString(), QString(), BindingSource::Unset, nullptr});
+        rows.append(
+            Binding{++lastId, function, QString(), QString(), QByteArray(), BindingSource::Unset, nullptr, false});
     return heldElsewhere;
 }
 
@@ -460,7 +461,8 @@ void HotkeysModel::setCommand(BindingId id, const QString& command)
 
 BindingId HotkeysModel::addCommand(const QString& command)
 {
-    commandRows.append(Binding{++lastId, -1, command, QString(), BindingSource::User, nullptr});
+    commandRows.append(
+        Binding{++lastId, -1, command, QString(), QByteArray(), BindingSource::User, nullptr, false});
     return lastId;
 }
 
@@ -481,8 +483,8 @@ BindingId HotkeysModel::cloneRow(BindingId id)
     const auto cloneIn = [&](QVector<Binding>& rows) -> BindingId {
         for (int i = 0; i < rows.size(); ++i) {
             if (rows.at(i).id == id) {
-                Binding copy{++lastId,  rows.at(i).function, rows.at(i).command,
-                             QString(), BindingSource::User, nullptr};
+                Binding copy{++lastId,     rows.at(i).function, rows.at(i).command, QString(),
+                             QByteArray(), BindingSource::User, nullptr,            false};
                 rows.insert(i + 1, copy);
                 return copy.id;
             }
@@ -510,32 +512,29 @@ bool HotkeysModel::removeRow(BindingId id)
 
 void HotkeysModel::assignPlaceholders(bool userFile)
 {
-    static const QRegularExpression placeholder(QStringLiteral("None([0-9]+)$"));
+    static const QRegularExpression placeholder(QStringLiteral("none([0-9]+)$"));
     QSet<int> inUse;
-    const auto note = [&](const QString& key) {
-        const QRegularExpressionMatch match = placeholder.match(key);
+    const auto note = [&](const QByteArray& fileKey) {
+        const QRegularExpressionMatch match = placeholder.match(QString::fromLatin1(foldedKey(fileKey)));
         if (match.hasMatch())
             inUse.insert(match.captured(1).toInt());
     };
-    for (const Binding* row : rows()) {
-        note(row->key);
-        if (row->origin)
-            note(QString::fromLocal8Bit(row->origin->rawKey));
-    }
+    for (const Binding* row : rows())
+        note(row->fileKey);
     for (const Kept& entry : qAsConst(kept))
-        note(QString::fromLocal8Bit(entry.origin->rawKey));
+        note(entry.fileKey);
+    for (const KeyEntry& entry : base->entries())
+        note(entry.key);
 
     int next = 0;
     for (Binding& row : commandRows) {
-        if (!row.key.isEmpty() || (userFile && row.source != BindingSource::User))
-            continue;
-        // A keyless command read from this file keeps the placeholder it was read under.
-        if (row.origin && row.origin->editedFile && row.origin->readKey.isEmpty())
+        if (!row.fileKey.isEmpty() || (userFile && row.source != BindingSource::User))
             continue;
         while (inUse.contains(next))
             ++next;
         inUse.insert(next);
         row.key = QStringLiteral("None%1").arg(next);
+        row.fileKey = toFileKey(row.key).toLocal8Bit();
         row.source = BindingSource::User;
     }
 }
@@ -543,99 +542,171 @@ void HotkeysModel::assignPlaceholders(bool userFile)
 bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
 {
     assignPlaceholders(userFile);
+    const int commandRank = functionNames().size();
 
-    struct Line
-    {
-        QByteArray key;
-        QByteArray value;
-        QByteArray leading;
-        QByteArray verbatim;
-        bool keyFromFile = false;
-        QString storedKey;
-    };
-    QVector<Line> out;
-    QHash<QByteArray, int> written;
-    // As the reader sets a value: a key that is already there keeps its place and takes the new
-    // value.
-    const auto put = [&](Line line) {
-        const QByteArray folded = foldedKey(line.key);
-        const auto it = written.constFind(folded);
-        if (it == written.cend()) {
-            written.insert(folded, out.size());
-            out.append(std::move(line));
-            return;
+    // What the file is to mean: one entry per key, in the order of the rows.
+    QVector<QByteArray> order;
+    QHash<QByteArray, Wanted> wanted;
+    const auto want = [&](const QByteArray& fileKey, Wanted entry, bool replace) {
+        const QByteArray identity = keyIdentity(fileKey);
+        const auto it = wanted.find(identity);
+        if (it == wanted.end()) {
+            order.append(identity);
+            wanted.insert(identity, entry);
+        } else if (replace) {
+            // As the reader sets a value: the key keeps its place and takes the new value.
+            it->value = entry.value;
+            it->rank = entry.rank;
+            it->keyProblem = entry.keyProblem;
+            it->valueProblem = entry.valueProblem;
         }
-        Line& earlier = out[*it];
-        earlier.value = line.value;
-        earlier.verbatim.clear();
     };
-
     for (const Binding* row : rows()) {
-        if (userFile && row->source != BindingSource::User)
+        if ((userFile && row->source != BindingSource::User) || row->fileKey.isEmpty())
             continue;
-        const EntryOrigin* origin = row->origin.get();
         const QString action = row->isCommand() ? row->command : functionNames().at(row->function);
-        const bool keyKept = origin && row->key == origin->readKey;
-        const bool actionKept = origin && action == origin->readAction;
-        const bool untouched = keyKept && actionKept && origin->editedFile;
-        if (row->key.isEmpty() && !(row->isCommand() && keyKept) && !untouched)
-            continue;
-        Line line;
-        line.key = writtenKey(row->key, origin);
-        line.keyFromFile = keyKept && !origin->rawKey.isEmpty();
-        line.storedKey = row->key;
-        if (actionKept)
-            line.value = origin->rawValue;
-        else if (row->isCommand())
-            line.value = '"' + row->command.toLocal8Bit() + '"';
-        else
-            line.value = action.toLocal8Bit();
-        if (origin && origin->editedFile) {
-            line.leading = origin->leading;
-            if (untouched)
-                line.verbatim = origin->line;
+        const EntryOrigin* origin = row->origin.get();
+        Wanted entry{row->fileKey, QByteArray(), row->isCommand() ? commandRank : row->function, QString(),
+                     QString()};
+        if (origin && action == origin->readAction) {
+            entry.value = origin->rawValue;
+        } else if (row->isCommand()) {
+            entry.value = '"' + row->command.toLocal8Bit() + '"';
+            entry.valueProblem = commandProblem(row->command);
+        } else {
+            entry.value = action.toLocal8Bit();
         }
-        put(line);
+        if (entry.valueProblem.isEmpty())
+            entry.valueProblem = unwritableValue(entry.value);
+        const bool placeholder = !isKeyIdentity(keyIdentity(row->fileKey));
+        if (!isWritableFileKey(row->fileKey) ||
+            (row->keyRecorded && !placeholder && !readsBackAsWritten(row->key)))
+            entry.keyProblem = HotkeysFile::tr("The key \"%1\" cannot be written to a hotkeys file")
+                                   .arg(printableText(QString::fromLocal8Bit(row->fileKey)));
+        want(row->fileKey, entry, true);
     }
     for (const DisabledKey& key : qAsConst(disabled)) {
         const EntryOrigin* origin = key.origin.get();
-        Line line;
-        line.key = writtenKey(key.key, origin);
-        line.keyFromFile = origin && key.key == origin->readKey;
-        line.storedKey = key.key;
-        line.value = "\"Disable\"";
-        if (origin && origin->editedFile && origin->readAction == disableValue &&
-            key.key == origin->readKey) {
-            line.leading = origin->leading;
-            line.verbatim = origin->line;
-        }
-        put(line);
+        Wanted entry{key.fileKey, "\"Disable\"", commandRank + 1, QString(), QString()};
+        if (origin && origin->readAction == disableValue)
+            entry.value = origin->rawValue;
+        if (!isWritableFileKey(key.fileKey))
+            entry.keyProblem = HotkeysFile::tr("The key \"%1\" cannot be written to a hotkeys file")
+                                .arg(printableText(QString::fromLocal8Bit(key.fileKey)));
+        want(key.fileKey, entry, true);
     }
-    // What was read but not shown follows, unless a shown binding took its key since.
-    for (const Kept& entry : qAsConst(kept)) {
-        if (!written.contains(entry.foldedKey))
-            put({entry.origin->rawKey, entry.origin->rawValue, entry.origin->leading, entry.origin->line,
-                 true, QString()});
-    }
+    // What was read but not shown stays, unless a shown binding took its key since.
+    for (const Kept& entry : qAsConst(kept))
+        want(entry.fileKey, Wanted{entry.fileKey, entry.origin->rawValue, -1, QString(), QString()}, false);
 
-    QByteArray result = beforeSection + sectionHeader;
-    for (const Line& line : qAsConst(out)) {
-        result += line.leading;
-        if (!line.verbatim.isEmpty()) {
-            result += withLineEnd(line.verbatim);
+    // The file as read, and what changes in it: removed lines, values rewritten in place, new
+    // lines after the line they follow.
+    const HotkeysLines& lines = base->lines();
+    const QVector<HotkeysLine>& all = lines.lines();
+    QSet<int> removed;
+    QHash<int, QByteArray> rewritten;
+    QVector<const Wanted*> added;
+    for (const KeyEntry& entry : base->entries()) {
+        const auto it = wanted.constFind(entry.identity);
+        if (it != wanted.cend() && unquoted(it->value) == unquoted(entry.value))
+            continue; // the same meaning: every line of the key stays as written
+        for (int line : entry.others)
+            removed.insert(line);
+        if (it == wanted.cend()) {
+            if (entry.counting >= 0)
+                removed.insert(entry.counting);
             continue;
         }
-        const QString problem = unwritable(line.storedKey, line.key, line.keyFromFile, line.value);
+        if (!it->valueProblem.isEmpty()) {
+            *reason = it->valueProblem;
+            return false;
+        }
+        if (entry.counting >= 0)
+            rewritten.insert(entry.counting, it->value);
+        else
+            added.append(&*it);
+    }
+    for (const QByteArray& identity : qAsConst(order)) {
+        if (!base->find(identity))
+            added.append(&wanted[identity]);
+    }
+    for (const Wanted* entry : qAsConst(added)) {
+        const QString problem = entry->keyProblem.isEmpty() ? entry->valueProblem : entry->keyProblem;
         if (!problem.isEmpty()) {
             *reason = problem;
             return false;
         }
-        result += line.key + '=' + line.value + '\n';
     }
-    result += sectionEnd + otherSections + afterLast;
-    // No byte-order mark is written, not even one that stood inside the file and came first.
-    if (result.startsWith("\xEF\xBB\xBF"))
-        result.remove(0, 3);
-    *bytes = result;
+
+    // The section's entry lines that stay, with their places for new lines.
+    struct Slot
+    {
+        int line; // -1 for a new line
+        int rank;
+        const Wanted* entry;
+    };
+    QVector<Slot> places;
+    int header = -1;
+    for (int i = 0; i < all.size(); ++i) {
+        if (header < 0 && lines.isHotkeysSection(i))
+            header = i;
+        if (all.at(i).kind == HotkeysLine::Entry && lines.isHotkeysSection(all.at(i).section) &&
+            !removed.contains(i))
+            places.append({i, rankOf(rewritten.value(i, all.at(i).value)), nullptr});
+    }
+    bool ordered = true;
+    int highest = -1;
+    for (const Slot& slot : qAsConst(places)) {
+        if (slot.rank < 0)
+            continue;
+        ordered = ordered && slot.rank >= highest;
+        highest = std::max(highest, slot.rank);
+    }
+    std::stable_sort(added.begin(), added.end(),
+                     [](const Wanted* a, const Wanted* b) { return a->rank < b->rank; });
+    for (const Wanted* entry : qAsConst(added)) {
+        int after = places.size() - 1;
+        if (ordered) {
+            while (after >= 0 && (places.at(after).rank < 0 || places.at(after).rank > entry->rank))
+                --after;
+        }
+        places.insert(after + 1, {-1, entry->rank, entry});
+    }
+    // Each new line follows the line kept before it, or the section's header when none is.
+    const auto firstKept = std::find_if(places.cbegin(), places.cend(), [](const Slot& s) { return s.line >= 0; });
+    QHash<int, QVector<const Wanted*>> following;
+    int anchor = firstKept == places.cend() ? header : all.at(firstKept->line).section;
+    for (const Slot& slot : qAsConst(places)) {
+        if (slot.line >= 0)
+            anchor = slot.line;
+        else
+            following[anchor].append(slot.entry);
+    }
+
+    QByteArray out = lines.span(0, all.isEmpty() ? lines.textStart() : lines.leadingStart(0));
+    for (int i = 0; i < all.size(); ++i) {
+        const HotkeysLine& line = all.at(i);
+        out += lines.span(lines.leadingStart(i), line.start);
+        QByteArray own = lines.span(line.start, line.end);
+        if (removed.contains(i))
+            own.clear();
+        else if (rewritten.contains(i))
+            own = lines.span(line.start, line.valueStart) + rewritten.value(i) +
+                  lines.span(line.valueEnd, line.end);
+        const auto news = following.constFind(i);
+        if (news != following.cend()) {
+            QByteArray end = lineEndOf(own);
+            if (end.isEmpty()) {
+                // A last line without its line end gets one first.
+                end = "\n";
+                own += end;
+            }
+            for (const Wanted* entry : *news)
+                own += entry->key + '=' + entry->value + end;
+        }
+        out += own;
+    }
+    out += lines.trailing();
+    *bytes = out;
     return true;
 }

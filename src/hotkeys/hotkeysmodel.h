@@ -9,6 +9,8 @@
 
 #include <memory>
 
+class HotkeysEntries;
+
 using BindingId = quint32;
 
 enum class BindingSource {
@@ -17,16 +19,12 @@ enum class BindingSource {
     System, // from the system hotkeys file
 };
 
-// What a binding or a disabled key was read as, so that what nobody edits is written back
-// byte for byte.
+// What a binding or a disabled key was read as, so that an action nobody changed keeps the
+// bytes it was written in.
 struct EntryOrigin
 {
-    QByteArray leading; // comment and blank lines above it
-    QByteArray line;    // its whole line, line end included
-    QByteArray rawKey;  // key and value as written, trimmed
-    QByteArray rawValue;
-    QString readKey; // the stored key and the action it was read as
-    QString readAction;
+    QByteArray rawValue; // the value as written, trimmed
+    QString readAction;  // the action it was read as
     int lineNumber = 0;
     bool editedFile = false; // read from the edited file, not the system file
 };
@@ -38,8 +36,10 @@ struct Binding
     int function = -1; // index into HotkeysModel::functionNames(); -1 for a command
     QString command;   // commands only
     QString key;       // stored key: QKeySequence portable text, or text the key server could not read
+    QByteArray fileKey; // the key as the file writes it; a placeholder for a keyless command
     BindingSource source = BindingSource::Unset;
     std::shared_ptr<const EntryOrigin> origin;
+    bool keyRecorded = false; // fileKey was made from the stored key, not read from a file
 
     bool isCommand() const { return function < 0; }
 };
@@ -47,13 +47,15 @@ struct Binding
 struct DisabledKey
 {
     QString key;
+    QByteArray fileKey;
     std::shared_ptr<const EntryOrigin> origin;
 };
 
 // The bindings of one hotkeys file, merged over the system file when it is the user's, as
-// rows in the order the editor shows and writes them: every catalogue function with one or
-// more rows, then the commands. The rules of the file live here: merging, writing, and which
-// binding holds a key. No widgets.
+// rows in the order the editor shows them: every catalogue function with one or more rows, then
+// the commands. The rules of the file live here: merging, writing, and which binding holds a
+// key. Writing changes only the lines of the keys whose meaning the edits changed; everything
+// else of the file read comes back byte for byte. No widgets.
 class HotkeysModel
 {
 public:
@@ -77,19 +79,25 @@ public:
     // The key a disabled key is written under in the file.
     QByteArray disabledFileKey(const QString& key) const;
     // The key a binding is written under in the file.
-    QByteArray fileKeyOf(const Binding& binding) const { return writtenKey(binding.key, binding.origin.get()); }
+    QByteArray fileKeyOf(const Binding& binding) const;
     bool isDisabled(const QString& key) const;
+    bool isDisabledFileKey(const QByteArray& fileKey) const;
     // Read but not shown: entries of functions this editor does not know.
     int keptEntryCount() const { return kept.size(); }
+    // The edited file as it was read.
+    const QByteArray& readBytes() const;
 
-    // The binding whose key would be written under the same file key as `key`, or that holds
-    // the same stored key in any letter case; 0 when none. `except` is passed over.
+    // The binding whose key is the same key as `key` (a stored key; a multi-key sequence by its
+    // first key), or as the file key; 0 when none. `except` is passed over.
     BindingId holderOf(const QString& key, BindingId except = 0) const;
+    BindingId holderOfFileKey(const QByteArray& fileKey, BindingId except = 0) const;
 
     // Every edit keeps what the window shows equal to what is saved: a key freed from a system
     // binding, or from a user binding that hid the system file's binding of it, is switched
     // off, unless another row holds it.
     void setKey(BindingId id, const QString& key);
+    // The same for a key given in file form, written as given.
+    void setFileKey(BindingId id, const QByteArray& fileKey);
     void clearKey(BindingId id);
     void setCommand(BindingId id, const QString& command);
     BindingId addCommand(const QString& command);
@@ -107,8 +115,8 @@ public:
     // gives back the system keys that other rows hold, which stay with them.
     QStringList revertToSystem(int function);
 
-    // The file's bytes: the rows in order (only the user's when userFile), the disabled keys,
-    // then what was read but not shown; around them the rest of the file as it was read.
+    // The file's bytes: the file read, with the lines of every key whose meaning changed
+    // rewritten in place, removed or added (only the user's rows count when userFile).
     // Keyless commands are given placeholder keys first. False, with the reason, when an entry
     // cannot be written so that it reads back the same.
     bool toBytes(bool userFile, QByteArray* bytes, QString* reason);
@@ -116,17 +124,17 @@ public:
 private:
     struct Kept
     {
-        QByteArray foldedKey;
+        QByteArray fileKey;
         std::shared_ptr<const EntryOrigin> origin;
     };
 
     Binding* findMutable(BindingId id);
+    void assignKey(Binding* row, const QString& key, const QByteArray& fileKey, bool recorded);
     void keepFreedKeyOff(const Binding& row);
-    void enable(const QString& key);
+    void enable(const QByteArray& fileKey);
     // The system file's rows of the function, as loading arranges them, less the keys that rows
     // of other functions hold.
     QVector<Binding> systemRowsOf(int function) const;
-    QByteArray writtenKey(const QString& key, const EntryOrigin* origin) const;
     void assignPlaceholders(bool userFile);
 
     QVector<QVector<Binding>> functionRows;
@@ -135,13 +143,8 @@ private:
     QVector<Kept> kept;
     // What the system file binds: each function's keys in the order read, and every key.
     QHash<int, QVector<Binding>> systemBindings;
-    QSet<QString> systemKeys;
-    // The edited file around its entries: before the section, the section's header, what
-    // closes the section, the other sections, and what follows the last line.
-    QByteArray beforeSection;
-    QByteArray sectionHeader;
-    QByteArray sectionEnd;
-    QByteArray otherSections;
-    QByteArray afterLast;
+    QSet<QByteArray> systemKeys;
+    // The edited file as read: its bytes, lines and entries, which writing patches.
+    std::shared_ptr<const HotkeysEntries> base;
     BindingId lastId = 0;
 };

@@ -135,18 +135,23 @@ private:
     // The row the command operations act on: the first selected row, else the current one.
     QTreeWidgetItem* targetRow() const;
     BindingId bindingAt(const QTreeWidgetItem* row) const;
-    // Remembers what the edited file (and the system file it is merged with) now hold, and
-    // watches them for changes by other programs.
-    void watchFiles();
+    // Remembers what the edited file (which holds fileBytes) and the system file it is merged
+    // with now hold, and watches them for changes by other programs.
+    void watchFiles(const QByteArray& fileBytes);
     void rewatch();
-    bool changedOnDisk() const;
+    enum class DiskChange { None, EditedFile, SystemFile, Vanished };
+    DiskChange changedOnDisk() const;
+    // What both files hold now, in short, to tell whether they changed again.
+    QByteArray diskDigests() const;
     void filesChangedOnDisk();
     void reloadKeepingSelection();
     // Before a save: false when the file changed on disk and the user chose not to overwrite it
     // (Reload loads it as it is now).
-    bool mayOverwrite();
+    bool mayOverwrite(DiskChange change);
     // Copies a file's bytes through the same safe write as saving; says so when it fails.
     bool copyFile(const QString& from, const QString& to);
+    // Keeps the file as it is beside it, with "~" added to its name; says so when it cannot.
+    bool keepBackup(const QString& path);
 
     QTreeWidget* keysTree = nullptr;
     QGroupBox* keyGroupBox = nullptr;

@@ -2,6 +2,7 @@
 
 #include "bindingtree.h"
 #include "hotkeysfile.h"
+#include "safefile.h"
 #include "zemcore.h"
 #include "zemwmcommand.h"
 
@@ -16,6 +17,7 @@
 #include <QX11Info>
 
 #include <cstdio>
+#include <sys/stat.h>
 
 void KeysConfForm::updateTitle()
 {
@@ -92,10 +94,11 @@ bool KeysConfForm::copyFile(const QString& from, const QString& to)
     if (!source.isEmpty() && source == QFileInfo(to).canonicalFilePath())
         return true;
     // The copy goes through the same all-or-nothing write as saving: a full disk leaves the
-    // file it was to replace as it was.
+    // file it was to replace as it was; and it waits for any other writer of the target.
     QFile file(from);
     QString reason;
     QByteArray bytes;
+    DirectoryLock lock;
     if (!file.open(QIODevice::ReadOnly)) {
         reason = file.errorString();
     } else {
@@ -105,10 +108,31 @@ bool KeysConfForm::copyFile(const QString& from, const QString& to)
         else if (bytes.size() > largestHotkeysFile)
             reason = tr("The file is larger than 16 MiB");
     }
-    if (reason.isEmpty() && writeFileSafely(to, bytes, &reason))
+    if (reason.isEmpty() && lock.lock(to, &reason) && writeFileSafely(to, bytes, &reason))
         return true;
     QMessageBox::warning(this, tr("Error"),
                          tr("Can't copy %1\nto %2").arg(from, to) + QLatin1Char('\n') + reason,
+                         QMessageBox::Ok);
+    return false;
+}
+
+bool KeysConfForm::keepBackup(const QString& path)
+{
+    // The replaced file stays beside it, so that even a confirmed Restore can be taken back. The
+    // backup is a new file renamed into place: whatever stands under its name, a link another
+    // account planted included, is replaced and never written through, and it is as private
+    // as the file it keeps.
+    QString reason;
+    QByteArray bytes;
+    struct stat info;
+    if (!QFileInfo::exists(path))
+        return true;
+    if (readHotkeysFile(path, &bytes, &reason) && ::stat(QFile::encodeName(path).constData(), &info) == 0 &&
+        writeNewFile(path + QLatin1Char('~'), bytes, info.st_mode, &reason))
+        return true;
+    QMessageBox::warning(this, tr("Error"),
+                         tr("Can't copy %1\nto %2").arg(path, path + QLatin1Char('~')) + QLatin1Char('\n') +
+                             reason,
                          QMessageBox::Ok);
     return false;
 }
@@ -143,7 +167,7 @@ bool KeysConfForm::loadFile(const QString& path)
     // A loaded file has nothing to undo and no unsaved edits.
     undoStack->clear();
     fileChanged();
-    watchFiles();
+    watchFiles(model.readBytes());
     return true;
 }
 
@@ -170,7 +194,7 @@ bool KeysConfForm::saveFile()
         return false;
     }
     saveError.clear();
-    watchFiles();
+    watchFiles(bytes);
     return true;
 }
 
@@ -210,9 +234,23 @@ bool KeysConfForm::loadCurrentFileOr(const QString& previous)
 
 bool KeysConfForm::saveFileOrWarn()
 {
-    if (modified && !mayOverwrite())
-        return false;
-    if (saveFile())
+    // Another program may write the file at any moment: whether it did is asked under the lock
+    // that every writer of this program takes, and the lock is held until the file is replaced.
+    // It is let go while the user is asked, so that the others are not kept waiting.
+    DirectoryLock lock;
+    QByteArray accepted;
+    while (modified) {
+        if (!lock.lock(currentFile, &saveError))
+            break;
+        const DiskChange change = changedOnDisk();
+        if (change == DiskChange::None || diskDigests() == accepted)
+            break;
+        accepted = diskDigests();
+        lock.unlock();
+        if (!mayOverwrite(change))
+            return false;
+    }
+    if ((!modified || lock.isLocked()) && saveFile())
         return true;
     // The system's reason goes on a line of its own.
     QMessageBox::warning(this, tr("Error"),
@@ -254,8 +292,7 @@ void KeysConfForm::fileRestore()
 
     const QString previous = currentFile;
     currentFile = userHotkeysFilePath();
-    // The replaced file stays beside it, so that even a confirmed Restore can be taken back.
-    if (QFileInfo::exists(currentFile) && !copyFile(currentFile, currentFile + QLatin1Char('~'))) {
+    if (!keepBackup(currentFile)) {
         currentFile = previous;
         return;
     }
@@ -266,11 +303,12 @@ void KeysConfForm::fileRestore()
 
 void KeysConfForm::fileApply()
 {
-    const QByteArray command = reloadCommandFor(currentFile);
+    QString problem;
+    const QByteArray command = reloadCommandFor(currentFile, &problem);
     if (command.isEmpty()) {
         QMessageBox::warning(this, tr("Error"),
-                             tr("The window manager cannot be told to use this file: its name holds control "
-                                "characters or is too long.\nSave it under another name."),
+                             tr("The window manager cannot be told to use this file.\nSave it under another "
+                                "name.") + QLatin1Char('\n') + problem,
                              QMessageBox::Ok);
         return;
     }

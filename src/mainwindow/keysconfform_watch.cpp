@@ -43,10 +43,12 @@ QString identityOf(const QTreeWidgetItem* row)
 
 } // namespace
 
-void KeysConfForm::watchFiles()
+void KeysConfForm::watchFiles(const QByteArray& fileBytes)
 {
+    // The digest of the bytes read or written, not of the file read again: a change made in
+    // between must count as a change.
     watchedFile = currentFile;
-    watchedDigest = digestOf(currentFile);
+    watchedDigest = QCryptographicHash::hash(fileBytes, QCryptographicHash::Sha1);
     watchedSystem = currentFile == userHotkeysFilePath() ? systemHotkeysFilePath() : QString();
     systemDigest = digestOf(watchedSystem);
     rewatch();
@@ -68,17 +70,30 @@ void KeysConfForm::rewatch()
     }
 }
 
-bool KeysConfForm::changedOnDisk() const
+KeysConfForm::DiskChange KeysConfForm::changedOnDisk() const
 {
-    return !watchedFile.isEmpty() && watchedFile == currentFile &&
-           (digestOf(watchedFile) != watchedDigest || digestOf(watchedSystem) != systemDigest);
+    if (watchedFile.isEmpty() || watchedFile != currentFile)
+        return DiskChange::None;
+    if (!QFileInfo::exists(watchedFile))
+        return DiskChange::Vanished;
+    if (digestOf(watchedFile) != watchedDigest)
+        return DiskChange::EditedFile;
+    if (digestOf(watchedSystem) != systemDigest)
+        return DiskChange::SystemFile;
+    return DiskChange::None;
+}
+
+QByteArray KeysConfForm::diskDigests() const
+{
+    return digestOf(watchedFile) + digestOf(watchedSystem);
 }
 
 void KeysConfForm::filesChangedOnDisk()
 {
     rewatch();
     // With unsaved edits nothing is dropped: Save and Apply ask. A vanished file is told at Save.
-    if (!modified && changedOnDisk() && QFileInfo::exists(watchedFile))
+    const DiskChange change = changedOnDisk();
+    if (!modified && change != DiskChange::None && change != DiskChange::Vanished)
         reloadKeepingSelection();
 }
 
@@ -95,23 +110,29 @@ void KeysConfForm::reloadKeepingSelection()
     }
 }
 
-bool KeysConfForm::mayOverwrite()
+bool KeysConfForm::mayOverwrite(DiskChange change)
 {
-    if (watchedFile != currentFile || !changedOnDisk())
+    if (change == DiskChange::None)
         return true;
-    if (!QFileInfo::exists(watchedFile)) {
+    if (change == DiskChange::Vanished) {
         QMessageBox::information(
             this, tr("File changed on disk"),
             tr("%1 was deleted or renamed since it was loaded.\nIt is written anew.").arg(watchedFile),
             QMessageBox::Ok);
         return true;
     }
-    QMessageBox box(
-        QMessageBox::Warning, tr("File changed on disk"),
-        tr("%1 was changed by another program since it was loaded.\nOverwrite it with your edits, "
-           "reload it and drop them, or cancel?")
-            .arg(watchedFile),
-        QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel, this);
+    // Name the file that changed: the edits may be sound for the user's file and still rest on
+    // system bindings that are no longer there.
+    const QString text =
+        change == DiskChange::SystemFile
+            ? tr("The system hotkeys file %1 was changed by another program since it was loaded.\n"
+                 "Overwrite %2 with your edits, reload both and drop them, or cancel?")
+                  .arg(watchedSystem, watchedFile)
+            : tr("%1 was changed by another program since it was loaded.\nOverwrite it with your edits, "
+                 "reload it and drop them, or cancel?")
+                  .arg(watchedFile);
+    QMessageBox box(QMessageBox::Warning, tr("File changed on disk"), text,
+                    QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel, this);
     box.button(QMessageBox::Save)->setText(tr("Overwrite"));
     box.button(QMessageBox::Discard)->setText(tr("Reload"));
     box.setDefaultButton(QMessageBox::Cancel);

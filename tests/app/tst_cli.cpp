@@ -28,6 +28,7 @@ private:
     QTemporaryDir dir;
     QByteArray out;
     QByteArray err;
+    int lastStatus = -1;
 };
 
 void TestCli::init()
@@ -64,7 +65,8 @@ int TestCli::run(const QStringList& arguments, bool display)
     process.waitForFinished(10000);
     out = process.readAllStandardOutput();
     err = process.readAllStandardError();
-    return process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1;
+    lastStatus = process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1;
+    return lastStatus;
 }
 
 void TestCli::check_data()
@@ -83,9 +85,14 @@ void TestCli::check_data()
     QTest::newRow("a key the key server cannot read")
         << QByteArray("Ctrl|Bogus=ZEMWM_CLOSE\n")
         << QByteArray(":2: error: the key Ctrl|Bogus cannot be read\n") << 2;
-    QTest::newRow("the same key twice: the later line is named")
-        << QByteArray("Alt|x=ZEMWM_CLOSE\nALT|X=ZEMWM_LOCK\n")
-        << QByteArray(":3: warning: the key ALT|X is on line 2 too; only this line counts\n") << 1;
+    QTest::newRow("one key on several lines: each line that does not count is named")
+        << QByteArray("Alt|x=ZEMWM_CLOSE\nALT|X=ZEMWM_LOCK\nCtrl|Prior=ZEMWM_EXIT\nCtrl|Page_Up=ZEMWM_EXIT\n")
+        << QByteArray(":2: warning: the key Alt|x does not count: line 3 binds the same key\n"
+                      ":4: warning: the key Ctrl|Prior does not count: line 5 binds the same key\n")
+        << 1;
+    QTest::newRow("control characters are shown, not sent to the terminal")
+        << QByteArray("Alt|u=ZEMWM_\x1b[2J\n")
+        << QByteArray(":2: error: ZEMWM_\\x1b[2J is no function of the window manager\n") << 2;
     QTest::newRow("a program that is not there, on PATH or by path")
         << QByteArray("Alt|a=\"no-such-program -x\"\nAlt|b=\"/no/such/dir/prog\"\n")
         << QByteArray(":2: warning: the program of \"no-such-program -x\" is not installed\n"
@@ -134,9 +141,19 @@ void TestCli::edit_data()
     QTest::addColumn<QByteArray>("written"); // the user's file afterwards, its section line left out
 
     const QByteArray untouched = "Alt|F5=ZEMWM_LOCK\nCtrl|q=\"Disable\"\n";
-    QTest::newRow("set a free key, options last")
-        << QStringList{"set", "alt+ctrl+k", "xterm  -e top", "--file", "user/keyshortcutrc"} << 0
-        << QByteArray("Alt|F5=ZEMWM_LOCK\nCtrl|Alt|k=\"xterm -e top\"\nCtrl|q=\"Disable\"\n");
+    QTest::newRow("set a free key, options last, the command as given")
+        << QStringList{"set", "alt+ctrl+k", " xterm  -e top ", "--file", "user/keyshortcutrc"} << 0
+        << QByteArray("Alt|F5=ZEMWM_LOCK\nCtrl|Alt|k=\"xterm  -e top\"\nCtrl|q=\"Disable\"\n");
+    QTest::newRow("set, then unset a free key: the file as it was")
+        << QStringList{"set", "Super+KP_Equal", "xclock", "&&", "unset", "super+kp_equal"} << 0 << untouched;
+    QTest::newRow("a key is written as the keysym asked for")
+        << QStringList{"set", "Ctrl+Alt+|", "xclock"} << 0
+        << QByteArray("Alt|F5=ZEMWM_LOCK\nCtrl|Alt|bar=\"xclock\"\nCtrl|q=\"Disable\"\n");
+    QTest::newRow("an empty command") << QStringList{"set", "Alt+F9", " "} << 2 << untouched;
+    QTest::newRow("a control character in a command")
+        << QStringList{"set", "Alt+F9", "xterm\n-e rm"} << 2 << untouched;
+    QTest::newRow("--file= without a name") << QStringList{"set", "Alt+F9", "xclock", "--file="} << 64
+                                            << untouched;
     QTest::newRow("set a key another binding holds")
         << QStringList{"set", "Alt|F4", "ZEMWM_EXIT"} << 3 << untouched;
     QTest::newRow("--force takes it over, the system binding switched off")
@@ -158,7 +175,13 @@ void TestCli::edit()
         if (argument.startsWith(QLatin1String("user/")))
             argument = dir.filePath(argument);
     }
-    QCOMPARE(run(arguments), status);
+    // Commands joined by "&&" run one after the other; the status is the last one's.
+    for (int from = 0; from <= arguments.size(); from = arguments.indexOf(QStringLiteral("&&"), from) + 1) {
+        const int to = arguments.indexOf(QStringLiteral("&&"), from);
+        if (run(arguments.mid(from, to < 0 ? -1 : to - from)) != 0 || to < 0)
+            break;
+    }
+    QCOMPARE(lastStatus, status);
     QCOMPARE(read(QStringLiteral("user/keyshortcutrc")), "[ShortCutKeys]\n" + written);
     QCOMPARE(err.isEmpty(), status == 0);
 }

@@ -3,6 +3,8 @@
 // by the reader fuzz target, whose seeds hold the odd cases.)
 #include "bindingfilter.h"
 #include "hotkeysfile.h"
+#include "safefile.h"
+#include "keyforms.h"
 #include "zemcore.h"
 
 #include <QTemporaryDir>

@@ -2,6 +2,7 @@
 // recorder can produce is written so that it reads back as the same file key; and a stored key
 // read from a file is written the same way again once read back.
 #include "hotkeysfile.h"
+#include "keyforms.h"
 #include "zemkeyserver.h"
 
 #include <QKeySequence>

@@ -2,6 +2,7 @@
 // bytes: the line model decides what is written back, the reader what it means.
 #include "hotkeysdocument.h"
 #include "hotkeysfile.h"
+#include "keyforms.h"
 #include "hotkeyslines.h"
 
 #include <QMap>
