@@ -163,6 +163,7 @@ bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBy
     fresh.base = mainFile;
 
     QSet<QByteArray> boundKeys;
+    QSet<QByteArray> disabledKeys;
     QHash<int, QVector<Binding>> furtherRows;
     const auto addEntries = [&](const HotkeysEntries& file, BindingSource source) {
         const bool edited = source == BindingSource::User;
@@ -210,8 +211,10 @@ bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBy
                         fresh.kept.append({fileKey, origin});
                     continue;
                 }
-                if (!fresh.isDisabledFileKey(fileKey))
+                if (!disabledKeys.contains(entry.identity)) {
+                    disabledKeys.insert(entry.identity);
                     fresh.disabled.append({key, fileKey, origin});
+                }
             } else {
                 fresh.commandRows.append(
                     Binding{++fresh.lastId, -1, value, key, fileKey, source, origin, false});

@@ -2,6 +2,7 @@
 
 #include "zemkeyserver.h"
 
+#include <QHash>
 #include <QKeySequence>
 #include <QRegularExpression>
 #include <QStringList>
@@ -173,31 +174,61 @@ QString keyFromUserText(const QString& text)
     return readable ? stored : QString();
 }
 
-QByteArray keyIdentity(const QByteArray& fileKey)
+namespace {
+
+QByteArray identityOf(const QByteArray& fileKey)
 {
-    static const QRegularExpression placeholder(QStringLiteral("none[0-9]+"));
     // Everything below works on the key without letter case, so that keys the file takes for
     // one are one key here too.
     const QByteArray folded = foldedKey(unquoted(fileKey));
-    QString rest = QString::fromLatin1(folded);
-    rest.replace(QLatin1Char('|'), QLatin1Char('+'));
-    rest.remove(QStringLiteral("none+"));
-    rest.remove(placeholder);
-    if (rest.isEmpty())
+    QList<QByteArray> parts = QByteArray(folded).replace('|', '+').split('+');
+    // As reading does: "None" before a name and placeholders ("None" and digits) go.
+    QList<QByteArray> kept;
+    for (int i = 0; i < parts.size(); ++i) {
+        QByteArray part = parts.at(i);
+        if (part == "none" && i + 1 < parts.size())
+            continue;
+        for (int at = part.indexOf("none"); at >= 0; at = part.indexOf("none", at)) {
+            int end = at + 4;
+            while (end < part.size() && part.at(end) >= '0' && part.at(end) <= '9')
+                ++end;
+            if (end > at + 4)
+                part.remove(at, end - at);
+            else
+                at = end;
+        }
+        kept << part;
+    }
+    if (kept.size() == 1 && kept.first().isEmpty())
         return "p:" + folded;
 
-    const QStringList parts = rest.split(QLatin1Char('+'));
     int modifiers = 0;
-    for (int i = 0; i < parts.size() - 1; ++i) {
-        const int bit = modifierBit(parts.at(i).toLatin1());
+    for (int i = 0; i < kept.size() - 1; ++i) {
+        const int bit = modifierBit(kept.at(i));
         if (!bit)
             return "t:" + folded;
         modifiers |= bit;
     }
-    const quint32 sym = ZemKeyServer::keysymOfNameNoCase(parts.last().toLatin1());
+    const quint32 sym = ZemKeyServer::keysymOfNameNoCase(kept.last());
     if (!sym)
         return "t:" + folded;
     return "k:" + QByteArray::number(modifiers) + ':' + QByteArray::number(sym, 16);
+}
+
+} // namespace
+
+QByteArray keyIdentity(const QByteArray& fileKey)
+{
+    // Loading and writing ask for the same few keys again and again.
+    static QHash<QByteArray, QByteArray> known;
+    const auto it = known.constFind(fileKey);
+    if (it != known.cend())
+        return *it;
+    if (known.size() > 100000)
+        known.clear();
+    const QByteArray identity = identityOf(fileKey);
+    known.insert(fileKey, identity);
+    return identity;
 }
 
 bool isKeyIdentity(const QByteArray& identity)

@@ -33,6 +33,15 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size)
             std::abort();
     }
 
+    // One key, one meaning: letter case never makes two keys, and a key typed as the file
+    // writes it is the same key written the same way.
+    const QByteArray raw(reinterpret_cast<const char*>(data), int(size));
+    if (keyIdentity(raw) != keyIdentity(foldedKey(raw)))
+        std::abort();
+    const QByteArray typed = fileKeyFromTyped(QString::fromLatin1(raw));
+    if (!typed.isEmpty() && (!isWritableFileKey(typed) || fileKeyFromTyped(QString::fromLatin1(typed)) != typed))
+        std::abort();
+
     const QString text = QString::fromUtf8(reinterpret_cast<const char*>(data), int(size));
     toFileKey(text);
     const QString stored = fromFileKey(text);

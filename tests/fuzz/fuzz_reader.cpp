@@ -1,12 +1,14 @@
 // The line model and the INI reader must agree on every entry of [ShortCutKeys], whatever the
 // bytes: the line model decides what is written back, the reader what it means.
 #include "hotkeysdocument.h"
+#include "hotkeysentries.h"
 #include "hotkeysfile.h"
 #include "keyforms.h"
 #include "hotkeyslines.h"
 
 #include <QMap>
 
+#include <algorithm>
 #include <cstdlib>
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size)
@@ -31,6 +33,26 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size)
             std::abort();
     }
     if (hasSection != sectionSeen || read != scanned)
+        std::abort();
+
+    // Every line of the section belongs to one key, and exactly one line of each key counts.
+    HotkeysEntries entries;
+    if (entries.read(bytes) != hasSection)
+        std::abort();
+    QVector<int> owned;
+    for (const KeyEntry& entry : entries.entries()) {
+        if (entry.counting < 0)
+            std::abort();
+        owned << entry.counting << entry.others;
+    }
+    std::sort(owned.begin(), owned.end());
+    QVector<int> inSection;
+    for (int i = 0; i < entries.lines().lines().size(); ++i) {
+        const HotkeysLine& line = entries.lines().lines().at(i);
+        if (line.kind == HotkeysLine::Entry && entries.lines().isHotkeysSection(line.section))
+            inSection << i;
+    }
+    if (hasSection && owned != inSection)
         std::abort();
     return 0;
 }
