@@ -1,10 +1,15 @@
 // zem-hotkeys as an administrator runs it: a process of its own on small files, no display but
 // for apply; what it prints, its exit statuses and the bytes it writes.
 #include <QProcess>
+#include <QStandardPaths>
 #include <QTemporaryDir>
 #include <QtTest>
 
 #include <X11/Xlib.h>
+
+#include <memory>
+#include <unistd.h>
+#include <vector>
 
 class TestCli : public QObject
 {
@@ -17,11 +22,14 @@ private slots:
     void list();
     void edit_data();
     void edit();
+    void concurrentWriters();
+    void anotherAccountsFile();
     void applyAndUsage();
 
 private:
     // Runs zem-hotkeys; gives its exit status and fills what it printed.
-    int run(const QStringList& arguments, bool display = false);
+    // A launcher (a program and its arguments) runs it, as another account for example.
+    int run(const QStringList& arguments, bool display = false, const QStringList& launcher = {});
     void write(const QString& name, const QByteArray& entries);
     QByteArray read(const QString& name) const;
 
@@ -51,7 +59,7 @@ QByteArray TestCli::read(const QString& name) const
     return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
 }
 
-int TestCli::run(const QStringList& arguments, bool display)
+int TestCli::run(const QStringList& arguments, bool display, const QStringList& launcher)
 {
     QProcess process;
     QProcessEnvironment env = QProcessEnvironment::systemEnvironment();
@@ -61,7 +69,10 @@ int TestCli::run(const QStringList& arguments, bool display)
     if (!display)
         env.remove(QStringLiteral("DISPLAY"));
     process.setProcessEnvironment(env);
-    process.start(QStringLiteral(ZEM_CLI_BINARY), arguments);
+    if (launcher.isEmpty())
+        process.start(QStringLiteral(ZEM_CLI_BINARY), arguments);
+    else
+        process.start(launcher.first(), launcher.mid(1) + QStringList{QStringLiteral(ZEM_CLI_BINARY)} + arguments);
     process.waitForFinished(10000);
     out = process.readAllStandardOutput();
     err = process.readAllStandardError();
@@ -186,6 +197,56 @@ void TestCli::edit()
     QCOMPARE(err.isEmpty(), status == 0);
 }
 
+void TestCli::concurrentWriters()
+{
+    // Several zem-hotkeys set at the same moment on one file, round after round: every change
+    // is there afterwards, none lost to a writer that read before another wrote.
+    const int writers = 3;
+    QProcessEnvironment env = QProcessEnvironment::systemEnvironment();
+    env.insert(QStringLiteral("ZEM_USER_DIR"), dir.filePath(QStringLiteral("user")));
+    env.insert(QStringLiteral("ZEM_SYSTEM_DIR"), dir.filePath(QStringLiteral("system")));
+    env.remove(QStringLiteral("DISPLAY"));
+    for (int round = 0; round < 50; ++round) {
+        write(QStringLiteral("user/keyshortcutrc"), "Alt|F5=ZEMWM_LOCK\n");
+        std::vector<std::unique_ptr<QProcess>> processes;
+        for (int w = 0; w < writers; ++w) {
+            processes.push_back(std::make_unique<QProcess>());
+            processes.back()->setProcessEnvironment(env);
+            processes.back()->start(QStringLiteral(ZEM_CLI_BINARY),
+                                    {QStringLiteral("set"), QStringLiteral("Ctrl+Alt+F%1").arg(w + 1),
+                                     QStringLiteral("xclock -%1").arg(w)});
+        }
+        for (auto& process : processes) {
+            QVERIFY(process->waitForFinished(10000));
+            QVERIFY2(process->exitCode() == 0, process->readAllStandardError());
+        }
+        const QByteArray file = read(QStringLiteral("user/keyshortcutrc"));
+        for (int w = 0; w < writers; ++w)
+            QVERIFY2(file.contains(QStringLiteral("Ctrl|Alt|F%1=\"xclock -%2\"").arg(w + 1).arg(w).toLatin1()),
+                     qPrintable(QStringLiteral("round %1:\n%2").arg(round).arg(QString::fromLatin1(file))));
+    }
+}
+
+void TestCli::anotherAccountsFile()
+{
+    // Run as another account, on root's file in a directory it may read: refused with the reason,
+    // the file untouched.
+    if (::geteuid() != 0 || QStandardPaths::findExecutable(QStringLiteral("setpriv")).isEmpty())
+        QSKIP("needs root and setpriv");
+    QVERIFY(QFile::setPermissions(dir.path(), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner |
+                                                  QFile::ReadOther | QFile::ExeOther));
+    const QString path = dir.filePath(QStringLiteral("roots.rc"));
+    write(QStringLiteral("roots.rc"), "Alt|F5=ZEMWM_LOCK\n");
+    const QByteArray before = read(QStringLiteral("roots.rc"));
+    QCOMPARE(run({QStringLiteral("set"), QStringLiteral("Alt+F6"), QStringLiteral("ZEMWM_EXIT"),
+                  QStringLiteral("--file"), path},
+                 false, {QStringLiteral("setpriv"), QStringLiteral("--reuid=65534"), QStringLiteral("--regid=65534"),
+                         QStringLiteral("--clear-groups")}),
+             2);
+    QVERIFY2(err.contains("belongs to another account"), err);
+    QCOMPARE(read(QStringLiteral("roots.rc")), before);
+}
+
 void TestCli::applyAndUsage()
 {
     // Held open so that the X server keeps the property, as the window manager's connection does.
@@ -201,6 +262,23 @@ void TestCli::applyAndUsage()
         "ZEMWM_UPDATE_VAL SCKeysFile " +
         QFile::encodeName(dir.filePath(QStringLiteral("user/keyshortcutrc")))));
     QProcess::execute(QStringLiteral("xprop"), QStringLiteral("-root -remove _ZEMWM_COMMAND").split(' '));
+    // Nothing is sent for a file that is missing or no hotkeys file, or whose name cannot be
+    // sent as it is.
+    write(QStringLiteral("not.rc"), "!a=b\n");
+    const QString tooLong = QLatin1Char('/') + QString(5000, QLatin1Char('x'));
+    for (const QString& file : {dir.filePath(QStringLiteral("missing.rc")), dir.filePath(QStringLiteral("not.rc")), tooLong}) {
+        QCOMPARE(run({QStringLiteral("apply"), file}, true), 2);
+        QVERIFY(err.startsWith("zem-hotkeys: "));
+    }
+    QVERIFY(err.contains("too long"));
+    // A byte that is no UTF-8, given as it stands.
+    QCOMPARE(run({}, true,
+                 {QStringLiteral("sh"), QStringLiteral("-c"), QStringLiteral("exec \"$0\" apply \"$(printf 'bad\\377')\"")}),
+             2);
+    QVERIFY2(err.contains("not valid in the locale's encoding"), err);
+    xprop.start(QStringLiteral("xprop"), QStringLiteral("-root -notype _ZEMWM_COMMAND").split(' '));
+    QVERIFY(xprop.waitForFinished());
+    QVERIFY(xprop.readAllStandardOutput().contains("not found"));
     QCOMPARE(run({QStringLiteral("apply")}), 2);
     QVERIFY(err.startsWith("zem-hotkeys: "));
     QCOMPARE(run({}), 64);

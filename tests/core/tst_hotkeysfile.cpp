@@ -7,6 +7,7 @@
 #include "keyforms.h"
 #include "zemcore.h"
 
+#include <QProcess>
 #include <QTemporaryDir>
 #include <QtTest>
 
@@ -14,6 +15,7 @@
 #include <sys/mount.h>
 #include <sys/resource.h>
 #include <sys/wait.h>
+#include <sys/xattr.h>
 #include <unistd.h>
 
 namespace {
@@ -41,12 +43,20 @@ private slots:
     void locations();
     void keyForms_data();
     void keyForms();
+    void typedKeys_data();
+    void typedKeys();
+    void oneKey_data();
+    void oneKey();
+    void textRules_data();
+    void textRules();
     void filter_data();
     void filter();
     void refused_data();
     void refused();
     void failedWriteKeepsFile();
     void writeKeepsModeAndLink();
+    void refusedWrites_data();
+    void refusedWrites();
 
 private:
     QTemporaryDir dir;
@@ -107,6 +117,82 @@ void TestHotkeysFile::keyForms()
         QCOMPARE(fromFileKey(file), stored);
     else
         QCOMPARE(fromFileKey(file), QString());
+}
+
+void TestHotkeysFile::typedKeys_data()
+{
+    QTest::addColumn<QString>("typed");
+    QTest::addColumn<QByteArray>("file"); // empty: no key
+    QTest::newRow("modifiers in any order, any case") << "alt+ctrl+t" << QByteArray("Ctrl|Alt|t");
+    QTest::newRow("the file form") << "None|F5" << QByteArray("None|F5");
+    QTest::newRow("| after a separator is the bar key") << "Ctrl+Alt+|" << QByteArray("Ctrl|Alt|bar");
+    QTest::newRow("+ after a separator is the plus key") << "ctrl++" << QByteArray("Ctrl|plus");
+    QTest::newRow("a keypad keysym stays itself") << "Ctrl+KP_Equal" << QByteArray("Ctrl|KP_Equal");
+    QTest::newRow("Qt's keypad spelling") << "Num+=" << QByteArray("None|KP_Equal");
+    QTest::newRow("an X name in other letter case") << "Super+page_up" << QByteArray("Super|Prior");
+    QTest::newRow("a Qt name") << "Win+PgDown" << QByteArray("Super|Next");
+    QTest::newRow("a character") << "Alt+\u00f6" << QByteArray("Alt|odiaeresis");
+    QTest::newRow("a modifier without a key") << "Ctrl+" << QByteArray();
+    QTest::newRow("an unknown name") << "Ctrl+Bogus" << QByteArray();
+    QTest::newRow("an unknown modifier") << "Hyper+x" << QByteArray();
+}
+
+void TestHotkeysFile::typedKeys()
+{
+    QFETCH(QString, typed);
+    QFETCH(QByteArray, file);
+    QCOMPARE(fileKeyFromTyped(typed), file);
+}
+
+void TestHotkeysFile::oneKey_data()
+{
+    QTest::addColumn<QByteArray>("a");
+    QTest::addColumn<QByteArray>("b");
+    QTest::addColumn<bool>("same");
+    QTest::newRow("two names of one keysym") << QByteArray("Ctrl|Prior") << QByteArray("ctrl|Page_Up") << true;
+    QTest::newRow("letter case, even where X tells keysyms apart")
+        << QByteArray("None|Odiaeresis") << QByteArray("none|odiaeresis") << true;
+    QTest::newRow("None| or not, aliases of modifiers")
+        << QByteArray("F5") << QByteArray("None|f5") << true;
+    QTest::newRow("modifier aliases in another order")
+        << QByteArray("Mod4|Control|x") << QByteArray("Ctrl|Super|X") << true;
+    QTest::newRow("the keypad's = and the other =")
+        << QByteArray("Ctrl|Alt|KP_Equal") << QByteArray("Ctrl|Alt|equal") << false;
+    QTest::newRow("two placeholders") << QByteArray("None|None0") << QByteArray("None|None1") << false;
+    QTest::newRow("unreadable keys by their text")
+        << QByteArray("Ctrl|NoSuchKey") << QByteArray("CTRL|nosuchkey") << true;
+}
+
+void TestHotkeysFile::oneKey()
+{
+    QFETCH(QByteArray, a);
+    QFETCH(QByteArray, b);
+    QFETCH(bool, same);
+    QCOMPARE(keyIdentity(a) == keyIdentity(b), same);
+}
+
+void TestHotkeysFile::textRules_data()
+{
+    QTest::addColumn<QString>("command");
+    QTest::addColumn<QString>("printed");
+    QTest::addColumn<QString>("problem"); // the start of the reason it is refused; empty: accepted
+    QTest::newRow("an ordinary command") << "xterm -e 'top\\n'" << "xterm -e 'top\\n'" << "";
+    QTest::newRow("empty") << "" << "" << "The command is empty";
+    QTest::newRow("blank") << " \t " << " \\x09 " << "The command is empty";
+    QTest::newRow("an escape sequence") << "echo \x1b[2J" << "echo \\x1b[2J" << "The command holds the control character \\x1b";
+    QTest::newRow("a bell and a delete") << "a\x07\x7f" << "a\\x07\\x7f" << "The command holds the control character \\x07";
+    QTest::newRow("a C1 control and a line separator")
+        << "a\u0085b\u2028" << "a\\u{0085}b\\u{2028}" << "The command holds the control character \\u{0085}";
+}
+
+void TestHotkeysFile::textRules()
+{
+    QFETCH(QString, command);
+    QFETCH(QString, printed);
+    QFETCH(QString, problem);
+    QCOMPARE(printableText(command), printed);
+    QVERIFY2(problem.isEmpty() ? commandProblem(command).isEmpty() : commandProblem(command).startsWith(problem),
+             qPrintable(commandProblem(command)));
 }
 
 void TestHotkeysFile::filter_data()
@@ -225,11 +311,66 @@ void TestHotkeysFile::writeKeepsModeAndLink()
     QVERIFY(QFile::setPermissions(target, QFile::ReadOwner | QFile::WriteOwner));
     QVERIFY(QFile::link(target, link));
 
+    // An access list and an attribute of the user's own, which a save must not drop.
+    QCOMPARE(QProcess::execute(QStringLiteral("setfacl"), {QStringLiteral("-m"), QStringLiteral("u:65534:r"), target}),
+             0);
+    QCOMPARE(::setxattr(QFile::encodeName(target).constData(), "user.zem", "kept", 4, 0), 0);
+    const QFile::Permissions mode = QFile::permissions(target); // the access list's mask in it
+
     QString reason;
-    QVERIFY(writeFileSafely(link, "new", &reason));
+    QVERIFY2(writeFileSafely(link, "new", &reason), qPrintable(reason));
     QVERIFY(QFileInfo(link).isSymLink());
     QCOMPARE(readAll(target), QByteArray("new"));
-    QCOMPARE(QFile::permissions(target) & 0x7077, QFile::ReadOwner | QFile::WriteOwner);
+    QCOMPARE(QFile::permissions(target), mode);
+    QProcess acl;
+    acl.start(QStringLiteral("getfacl"), {QStringLiteral("-cn"), target});
+    QVERIFY(acl.waitForFinished());
+    QVERIFY(acl.readAllStandardOutput().contains("user:65534:r--"));
+    char value[8] = {};
+    QCOMPARE(::getxattr(QFile::encodeName(target).constData(), "user.zem", value, sizeof value), ssize_t(4));
+    QCOMPARE(QByteArray(value), QByteArray("kept"));
+}
+
+void TestHotkeysFile::refusedWrites_data()
+{
+    QTest::addColumn<QString>("why");
+    QTest::addColumn<QString>("reason"); // a part of the reason given
+    QTest::newRow("its owner made it read-only, for root too") << "read-only" << "read-only";
+    QTest::newRow("a hard link elsewhere") << "linked" << "has 2 hard links";
+    QTest::newRow("more than 16 MiB") << "large" << "larger than 16 MiB";
+    QTest::newRow("root through another account's link") << "planted" << "symbolic link of another account";
+}
+
+void TestHotkeysFile::refusedWrites()
+{
+    QFETCH(QString, why);
+    QFETCH(QString, reason);
+    const QString base = dir.filePath(why);
+    QVERIFY(QDir().mkpath(base));
+    QString path = base + QLatin1String("/keyshortcutrc");
+    const QByteArray old = "[ShortCutKeys]\n";
+    QVERIFY(writeRaw(path, old));
+    QByteArray bytes = "[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\n";
+    if (why == QLatin1String("read-only")) {
+        QVERIFY(QFile::setPermissions(path, QFile::ReadOwner | QFile::ReadGroup | QFile::ReadOther));
+    } else if (why == QLatin1String("linked")) {
+        QCOMPARE(::link(QFile::encodeName(path).constData(), QFile::encodeName(base + "/hard").constData()), 0);
+    } else if (why == QLatin1String("large")) {
+        bytes = QByteArray(int(largestHotkeysFile) + 1, 'x');
+    } else {
+        if (::geteuid() != 0)
+            QSKIP("only root follows links as another account planted them");
+        const QString link = base + QLatin1String("/planted");
+        QVERIFY(QFile::link(path, link) &&
+                ::lchown(QFile::encodeName(link).constData(), 65534, 65534) == 0);
+        path = link;
+    }
+    QString said;
+    QVERIFY(!writeFileSafely(path, bytes, &said));
+    QVERIFY2(said.contains(reason), qPrintable(said));
+    QCOMPARE(readAll(base + QLatin1String("/keyshortcutrc")), old);
+    QCOMPARE(QDir(base).entryList(QDir::Files | QDir::Hidden | QDir::System).size(),
+             why == QLatin1String("linked") || why == QLatin1String("planted") ? 2 : 1);
 }
 
 QTEST_GUILESS_MAIN(TestHotkeysFile)

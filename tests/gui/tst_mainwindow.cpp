@@ -10,6 +10,8 @@
 #include <QGroupBox>
 #include <QLabel>
 #include <QLineEdit>
+#include <QProcess>
+#include <QThread>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QRandomGenerator>
@@ -58,6 +60,7 @@ private slots:
     void applyRefused();
     void changedOnDisk_data();
     void changedOnDisk();
+    void saveWhileCommandLineWrites();
     void filterAndFindKey();
     void undoRedo_data();
     void undoRedo();
@@ -328,8 +331,12 @@ void TestMainWindow::saveAsAndRestore()
              QByteArray("[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\nCtrl|k=ZEMWM_KILL\nAlt|F5=ZEMWM_LOCK\n"
                         "Ctrl|Alt|e=ZEMWM_EXIT\nCtrl|Alt|x=\"xclock\"\n"));
     // Restore asks first; Cancel changes nothing. Yes puts the system file in the place of the
-    // user's, keeps the user's beside it, and edits it.
+    // user's, keeps the user's beside it, and edits it. The backup replaces a link planted under
+    // its name instead of writing through it, and is as private as the file it keeps.
     const QByteArray before = readFile(userFile);
+    const QString victim = QFileInfo(userFile).path() + QLatin1String("/victim");
+    QVERIFY(writeFile(victim, "theirs") && QFile::link(victim, userFile + QLatin1Char('~')));
+    QVERIFY(QFile::setPermissions(userFile, QFile::ReadOwner | QFile::WriteOwner));
     form->fileRestore();
     QCOMPARE(answerer.titles(), QStringList{"Restore"});
     QCOMPARE(KeysConfForm::editedFile(), other);
@@ -337,6 +344,9 @@ void TestMainWindow::saveAsAndRestore()
     QCOMPARE(readFile(userFile),
              readFile(QFileInfo(userFile).path() + QLatin1String("/../system/keyshortcutrc")));
     QCOMPARE(readFile(userFile + QLatin1Char('~')), before);
+    QVERIFY(!QFileInfo(userFile + QLatin1Char('~')).isSymLink());
+    QCOMPARE(QFile::permissions(userFile + QLatin1Char('~')) & 0x0077, QFile::Permissions());
+    QCOMPARE(readFile(victim), QByteArray("theirs"));
     QCOMPARE(KeysConfForm::editedFile(), userFile);
 }
 
@@ -372,11 +382,14 @@ void TestMainWindow::changedOnDisk_data()
     QTest::addColumn<bool>("edited");
     QTest::addColumn<QMessageBox::StandardButton>("answer"); // Save: Overwrite, Discard: Reload
     QTest::addColumn<QString>("lockKey");                    // ZEMWM_LOCK's key afterwards
+    QTest::addColumn<bool>("system");                        // the system file changed, not the user's
     QTest::newRow("no unsaved edits: loaded at once, the row stays selected")
-        << false << QMessageBox::Ok << "Alt+F6";
-    QTest::newRow("Cancel keeps the edits and the file") << true << QMessageBox::Cancel << "Alt+F5";
-    QTest::newRow("Overwrite") << true << QMessageBox::Save << "Alt+F5";
-    QTest::newRow("Reload drops the edits") << true << QMessageBox::Discard << "Alt+F6";
+        << false << QMessageBox::Ok << "Alt+F6" << false;
+    QTest::newRow("Cancel keeps the edits and the file") << true << QMessageBox::Cancel << "Alt+F5" << false;
+    QTest::newRow("Overwrite") << true << QMessageBox::Save << "Alt+F5" << false;
+    QTest::newRow("Reload drops the edits") << true << QMessageBox::Discard << "Alt+F6" << false;
+    QTest::newRow("the system file alone changed: the box names it")
+        << true << QMessageBox::Cancel << "Alt+F5" << true;
 }
 
 void TestMainWindow::changedOnDisk()
@@ -384,21 +397,53 @@ void TestMainWindow::changedOnDisk()
     QFETCH(bool, edited);
     QFETCH(QMessageBox::StandardButton, answer);
     QFETCH(QString, lockKey);
+    QFETCH(bool, system);
     if (edited) {
         select(QStringLiteral("ZEMWM_EXIT"));
         form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
     }
     select(QStringLiteral("ZEMWM_LOCK"));
+    const QString changed = system ? QFileInfo(userFile).path() + QLatin1String("/../system/keyshortcutrc") : userFile;
     const QByteArray theirs = "[ShortCutKeys]\nAlt|F6=ZEMWM_LOCK\n";
-    QVERIFY(writeFile(userFile, theirs));
+    const QByteArray ours = readFile(userFile);
+    QVERIFY(writeFile(changed, theirs));
     ModalAnswerer answerer({answer});
     if (edited)
         form->fileSave();
     QTRY_COMPARE(KeysConfForm::itemKey(row(QStringLiteral("ZEMWM_LOCK"))), lockKey);
     QCOMPARE(form->findChild<QTreeWidget*>()->currentItem(), row(QStringLiteral("ZEMWM_LOCK")));
     QCOMPARE(answerer.titles(), edited ? QStringList{"File changed on disk"} : QStringList());
-    QCOMPARE(readFile(userFile) == theirs, answer != QMessageBox::Save);
+    if (edited)
+        QCOMPARE(answerer.last().text.contains(QLatin1String("system")), system);
+    QCOMPARE(readFile(userFile) == (system ? ours : theirs), answer != QMessageBox::Save);
     QCOMPARE(KeysConfForm::isModified(), answer == QMessageBox::Cancel);
+}
+
+void TestMainWindow::saveWhileCommandLineWrites()
+{
+    // The editor's Save and a zem-hotkeys set at the same moment: the command line's change is
+    // always in the file, and the editor's too unless the editor asked before overwriting it.
+    for (int round = 1; round <= 8; ++round) {
+        const QString theirs = QStringLiteral("Ctrl+Alt+F%1").arg(round);
+        select(QStringLiteral("ZEMWM_EXIT"), 0);
+        form->setKey(QKeySequence(QStringLiteral("Ctrl+Shift+F%1").arg(round)));
+        QProcess writer;
+        writer.start(QStringLiteral(ZEM_CLI_BINARY), {QStringLiteral("set"), theirs, QStringLiteral("xclock")});
+        QVERIFY(writer.waitForStarted());
+        ModalAnswerer answerer({QMessageBox::Cancel});
+        // Before, while and after the command line reads and writes.
+        QThread::msleep(ulong(round % 4) * 12);
+        form->fileSave();
+        QVERIFY(writer.state() == QProcess::NotRunning || writer.waitForFinished(10000));
+        QVERIFY2(writer.exitCode() == 0, writer.readAllStandardError());
+        const QByteArray file = readFile(userFile);
+        QVERIFY2(file.contains(QStringLiteral("Ctrl|Alt|F%1=\"xclock\"").arg(round).toLatin1()), file);
+        const bool asked = answerer.titles() == QStringList{"File changed on disk"};
+        QVERIFY2(file.contains(QStringLiteral("Ctrl|Shift|F%1=ZEMWM_EXIT").arg(round).toLatin1()) ||
+                     (asked && KeysConfForm::isModified()),
+                 file);
+        QVERIFY(form->loadFile(userFile));
+    }
 }
 
 void TestMainWindow::filterAndFindKey()
