@@ -82,6 +82,15 @@ int main(int argc, char** argv)
     QString path;
     if (arguments.size() == 1) {
         path = arguments.first();
+        if (!isFaithfulFileName(QByteArray(argv[1]))) {
+            // Read in the locale's encoding it names another file, which would be created.
+            std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n",
+                         printableText(QFile::decodeName(argv[1])).toLocal8Bit().constData(),
+                         QObject::tr("the file name is not valid in the locale's encoding").toLocal8Bit().constData());
+            delete form;
+            delete app;
+            return CreationDeclined;
+        }
         if (path.startsWith(QLatin1Char('%'))) {
             // An unexpanded field code from a desktop entry: behave as if started without one.
             path.clear();
@@ -102,7 +111,7 @@ int main(int argc, char** argv)
     // Created all or nothing: a full disk must not leave an empty file that no later start can read.
     QString reason;
     if (!QFile::exists(path) && !writeFileSafely(path, emptyHotkeysFile, &reason)) {
-        std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n", path.toLocal8Bit().constData(),
+        std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n", printableText(path).toLocal8Bit().constData(),
                      reason.toLocal8Bit().constData());
         QMessageBox::warning(nullptr, QObject::tr("Attention"),
                              QObject::tr("Can't open/create file:\n%1").arg(path) + QLatin1Char('\n') +

@@ -1,5 +1,7 @@
 #include "selectcommanddialog.h"
 
+#include "hotkeysfile.h"
+
 #include "zemmenudialog.h"
 
 #include <QCoreApplication>
@@ -99,6 +101,13 @@ QString SelectCommandDialog::command() const
 
 void SelectCommandDialog::accept()
 {
+    // A control character is refused as it stands, not folded into a blank; an empty command
+    // binds nothing. Either way the dialog stays open with what was typed.
+    const QString problem = commandProblem(commandLineEdit->text());
+    if (!problem.isEmpty()) {
+        QMessageBox::warning(this, tr("Attention"), problem, QMessageBox::Ok);
+        return;
+    }
     commandLineEdit->setText(commandLineEdit->text().simplified());
     saveSize();
     QDialog::accept();

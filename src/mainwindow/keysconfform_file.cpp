@@ -148,7 +148,7 @@ bool KeysConfForm::loadFile(const QString& path)
         return false;
     const QString systemPath = path == userHotkeysFilePath() ? systemHotkeysFilePath() : QString();
     if (!model.load(path, systemPath, &failedPath, &loadError)) {
-        std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n", failedPath.toLocal8Bit().constData(),
+        std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n", printableText(failedPath).toLocal8Bit().constData(),
                      loadError.toLocal8Bit().constData());
         return false;
     }
@@ -190,7 +190,7 @@ bool KeysConfForm::saveFile()
     bindingTree->refreshCommands();
     if (!composed || !writeFileSafely(currentFile, bytes, &saveError)) {
         std::fprintf(stderr, "zem-admin-hotkeys: Can't save file %s\n",
-                     currentFile.toLocal8Bit().constData());
+                     printableText(currentFile).toLocal8Bit().constData());
         return false;
     }
     saveError.clear();

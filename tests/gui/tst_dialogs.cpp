@@ -1,6 +1,9 @@
 // The command dialog and the desktop-menu chooser behind it.
 #include "modalanswerer.h"
 #include "selectcommanddialog.h"
+
+#include <QDialogButtonBox>
+#include <QPushButton>
 #include "testenvironment.h"
 #include "zemmenudialog.h"
 
@@ -15,6 +18,8 @@ class TestDialogs : public QObject
     Q_OBJECT
 
 private slots:
+    void typedCommand_data();
+    void typedCommand();
     void executableLoop_data();
     void executableLoop();
     void desktopEntries();
@@ -22,6 +27,29 @@ private slots:
 private:
     QTemporaryDir scratch;
 };
+
+void TestDialogs::typedCommand_data()
+{
+    QTest::addColumn<QString>("typed");
+    QTest::addColumn<QString>("command"); // what OK gives; empty: refused, the dialog stays open
+    QTest::newRow("blanks are simplified") << "  xterm   -e top " << "xterm -e top";
+    QTest::newRow("empty") << "   " << "";
+    QTest::newRow("a tab is refused, not folded into a blank") << "xterm\t-e top" << "";
+}
+
+void TestDialogs::typedCommand()
+{
+    QFETCH(QString, typed);
+    QFETCH(QString, command);
+    SelectCommandDialog dialog(nullptr);
+    dialog.setCommand(typed);
+    dialog.show();
+    ModalAnswerer answerer({QMessageBox::Ok});
+    QMetaObject::invokeMethod(dialog.findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok), "click");
+    QCOMPARE(dialog.result() == QDialog::Accepted, !command.isEmpty());
+    QCOMPARE(answerer.titles(), command.isEmpty() ? QStringList{"Attention"} : QStringList());
+    QCOMPARE(dialog.command(), command.isEmpty() ? typed : command);
+}
 
 void TestDialogs::executableLoop_data()
 {
