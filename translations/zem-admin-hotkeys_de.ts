@@ -1,4 +1,5 @@
-<?xml version='1.0' encoding='utf-8'?>
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
 <TS version="2.1" language="de_DE">
 <context>
     <name>Handbook</name>
@@ -7,7 +8,7 @@
         <translation>Handbuch des Zem-Tastenkürzel-Editors</translation>
     </message>
     <message>
-        <source>&lt;h2&gt;Zem hotkeys editor&lt;/h2&gt;&lt;p&gt;The editor shows every function of the zem-wm window manager in its group, and below &lt;i&gt;Command Keybindings&lt;/i&gt; the command lines of your own, each with its key. &lt;b&gt;Current Key&lt;/b&gt; is the key combination that starts it; &lt;b&gt;Source&lt;/b&gt; says whether the binding comes from your own hotkeys file (&lt;i&gt;user&lt;/i&gt;) or from the system-wide one (&lt;i&gt;system&lt;/i&gt;), which gives every user's defaults.&lt;/p&gt;</source>
+        <source>&lt;h2&gt;Zem hotkeys editor&lt;/h2&gt;&lt;p&gt;The editor shows every function of the zem-wm window manager in its group, and below &lt;i&gt;Command Keybindings&lt;/i&gt; the command lines of your own, each with its key. &lt;b&gt;Current Key&lt;/b&gt; is the key combination that starts it; &lt;b&gt;Source&lt;/b&gt; says whether the binding comes from your own hotkeys file (&lt;i&gt;user&lt;/i&gt;) or from the system-wide one (&lt;i&gt;system&lt;/i&gt;), which gives every user&apos;s defaults.&lt;/p&gt;</source>
         <translation>&lt;h2&gt;Zem-Tastenkürzel-Editor&lt;/h2&gt;&lt;p&gt;Der Editor zeigt jede Funktion des Fenstermanagers zem-wm in ihrer Gruppe und unter &lt;i&gt;Befehlskürzel&lt;/i&gt; Ihre eigenen Befehlszeilen, jede mit ihrem Kürzel. &lt;b&gt;Aktuelles Kürzel&lt;/b&gt; ist die Tastenkombination, die sie auslöst; &lt;b&gt;Herkunft&lt;/b&gt; sagt, ob die Belegung aus Ihrer eigenen Tastenkürzeldatei (&lt;i&gt;Benutzer&lt;/i&gt;) stammt oder aus der des Systems (&lt;i&gt;System&lt;/i&gt;), die allen Benutzern die Voreinstellungen gibt.&lt;/p&gt;</translation>
     </message>
     <message>
@@ -50,16 +51,60 @@
         <translation>Die Datei enthält NUL-Bytes</translation>
     </message>
     <message>
-        <source>The key "%1" cannot be written to a hotkeys file</source>
+        <source>The key &quot;%1&quot; cannot be written to a hotkeys file</source>
         <translation>Das Kürzel „%1“ kann nicht in eine Tastenkürzeldatei geschrieben werden</translation>
     </message>
     <message>
-        <source>The action "%1" cannot be written to a hotkeys file</source>
+        <source>The action &quot;%1&quot; cannot be written to a hotkeys file</source>
         <translation>Die Aktion „%1“ kann nicht in eine Tastenkürzeldatei geschrieben werden</translation>
     </message>
     <message>
         <source>No [ShortCutKeys] section</source>
         <translation>Kein Abschnitt [ShortCutKeys]</translation>
+    </message>
+    <message>
+        <source>The command is empty</source>
+        <translation>Der Befehl ist leer</translation>
+    </message>
+    <message>
+        <source>The command holds the control character %1, which a hotkeys file cannot hold</source>
+        <translation>Der Befehl enthält das Steuerzeichen %1, das eine Tastenkürzeldatei nicht aufnehmen kann</translation>
+    </message>
+    <message>
+        <source>The file name holds control characters</source>
+        <translation>Der Dateiname enthält Steuerzeichen</translation>
+    </message>
+    <message>
+        <source>The file name cannot be written in the locale&apos;s encoding</source>
+        <translation>Der Dateiname lässt sich in der Kodierung der Sprachumgebung nicht schreiben</translation>
+    </message>
+    <message>
+        <source>The file name is too long to be handed to the window manager</source>
+        <translation>Der Dateiname ist zu lang, um ihn an den Fenstermanager zu übergeben</translation>
+    </message>
+    <message>
+        <source>%1 is a symbolic link of another account</source>
+        <translation>%1 ist eine symbolische Verknüpfung eines anderen Kontos</translation>
+    </message>
+    <message>
+        <source>%1 is read-only: its owner&apos;s write permission is off</source>
+        <translation>%1 ist schreibgeschützt: Der Besitzer hat kein Schreibrecht</translation>
+    </message>
+    <message>
+        <source>%1 belongs to another account</source>
+        <translation>%1 gehört einem anderen Konto</translation>
+    </message>
+    <message>
+        <source>%1 has %2 hard links; replacing it would part it from the others</source>
+        <translation>%1 hat %2 harte Verknüpfungen; sie zu ersetzen, würde sie von den anderen trennen</translation>
+    </message>
+    <message>
+        <source>The file would be larger than 16 MiB</source>
+        <translation>Die Datei wäre größer als 16 MiB</translation>
+    </message>
+    <message>
+        <source>Another program is writing a hotkeys file in %1; gave up waiting after %2 seconds</source>
+        <translation>Ein anderes Programm schreibt eine Tastenkürzeldatei in %1; nach %2 Sekunden Warten aufgegeben</translation>
     </message>
 </context>
 <context>
@@ -752,7 +797,7 @@
     </message>
     <message>
         <source>Command Keybindings</source>
-        <extracomment>The group row under which the user's command entries are listed.</extracomment>
+        <extracomment>The group row under which the user&apos;s command entries are listed.</extracomment>
         <translation>Befehlskürzel</translation>
     </message>
     <message>
@@ -808,7 +853,7 @@
         <translation>&amp;Wiederherstellen …</translation>
     </message>
     <message>
-        <source>Restore user's keyshortcutrc file from system one</source>
+        <source>Restore user&apos;s keyshortcutrc file from system one</source>
         <translation>Die keyshortcutrc des Benutzers aus der des Systems wiederherstellen</translation>
     </message>
     <message>
@@ -919,7 +964,7 @@
         <translation>Fehler</translation>
     </message>
     <message>
-        <source>Can't create file </source>
+        <source>Can&apos;t create file </source>
         <translation>Datei kann nicht angelegt werden: </translation>
     </message>
     <message>
@@ -927,7 +972,7 @@
         <translation>Die Datei ist größer als 16 MiB</translation>
     </message>
     <message>
-        <source>Can't copy %1
+        <source>Can&apos;t copy %1
 to %2</source>
         <translation>%1
 kann nicht nach %2 kopiert werden</translation>
@@ -941,13 +986,13 @@ kann nicht nach %2 kopiert werden</translation>
         <translation>Achtung</translation>
     </message>
     <message>
-        <source>Can't parse file:
+        <source>Can&apos;t parse file:
 %1</source>
         <translation>Datei kann nicht gelesen werden:
 %1</translation>
     </message>
     <message>
-        <source>Can't save in file </source>
+        <source>Can&apos;t save in file </source>
         <translation>Speichern nicht möglich in </translation>
     </message>
     <message>
@@ -965,18 +1010,12 @@ Alle Ihre eigenen Kürzel darin gehen verloren.</translation>
         <translation>Alle Änderungen gehen verloren. Speichern?</translation>
     </message>
     <message>
-        <source>The window manager cannot be told to use this file: its name holds control characters or is too long.
-Save it under another name.</source>
-        <translation>Dem Fenstermanager kann diese Datei nicht übergeben werden: Ihr Name enthält Steuerzeichen oder ist zu lang.
-Speichern Sie sie unter einem anderen Namen.</translation>
-    </message>
-    <message>
         <source>Warning</source>
         <translation>Warnung</translation>
     </message>
     <message>
-        <source>You current file is "%1".
-After restart zem-wm will use "%2".</source>
+        <source>You current file is &quot;%1&quot;.
+After restart zem-wm will use &quot;%2&quot;.</source>
         <translation>Die aktuelle Datei ist „%1“.
 Nach einem Neustart verwendet zem-wm „%2“.</translation>
     </message>
@@ -998,7 +1037,7 @@ Nach einem Neustart verwendet zem-wm „%2“.</translation>
     </message>
     <message numerus="yes">
         <source>%1 of %n bindings</source>
-        <extracomment>Shown while a filter is active, for example "3 of 186 bindings".</extracomment>
+        <extracomment>Shown while a filter is active, for example &quot;3 of 186 bindings&quot;.</extracomment>
         <translation>
             <numerusform>%1 von %n Kürzel</numerusform>
             <numerusform>%1 von %n Kürzeln</numerusform>
@@ -1026,7 +1065,7 @@ Nach einem Neustart verwendet zem-wm „%2“.</translation>
     </message>
     <message>
         <source>command</source>
-        <extracomment>Names a command entry in "to the %2 action (%3)", where %3 is its command line.</extracomment>
+        <extracomment>Names a command entry in &quot;to the %2 action (%3)&quot;, where %3 is its command line.</extracomment>
         <translation>Befehl</translation>
     </message>
     <message>
@@ -1076,6 +1115,18 @@ Mit Ihren Änderungen überschreiben, neu laden und Ihre Änderungen verwerfen, 
         <source>Reload</source>
         <translation>Neu laden</translation>
     </message>
+    <message>
+        <source>The window manager cannot be told to use this file.
+Save it under another name.</source>
+        <translation>Dem Fenstermanager kann diese Datei nicht übergeben werden.
+Speichern Sie sie unter einem anderen Namen.</translation>
+    </message>
+    <message>
+        <source>The system hotkeys file %1 was changed by another program since it was loaded.
+Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
+        <translation>Die System-Tastenkürzeldatei %1 wurde seit dem Laden von einem anderen Programm geändert.
+%2 mit Ihren Änderungen überschreiben, beide neu laden und die Änderungen verwerfen, oder abbrechen?</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -1090,7 +1141,7 @@ Mit Ihren Änderungen überschreiben, neu laden und Ihre Änderungen verwerfen, 
         <translation>Warnung</translation>
     </message>
     <message>
-        <source>File %1 doesn't exist. Create?</source>
+        <source>File %1 doesn&apos;t exist. Create?</source>
         <translation>Datei %1 gibt es nicht. Anlegen?</translation>
     </message>
     <message>
@@ -1098,16 +1149,20 @@ Mit Ihren Änderungen überschreiben, neu laden und Ihre Änderungen verwerfen, 
         <translation>Achtung</translation>
     </message>
     <message>
-        <source>Can't open/create file:
+        <source>Can&apos;t open/create file:
 %1</source>
         <translation>Datei kann nicht geöffnet/angelegt werden:
 %1</translation>
     </message>
     <message>
-        <source>Can't parse file:
+        <source>Can&apos;t parse file:
 %1</source>
         <translation>Datei kann nicht gelesen werden:
 %1</translation>
+    </message>
+    <message>
+        <source>the file name is not valid in the locale&apos;s encoding</source>
+        <translation>der Dateiname ist in der Kodierung der Sprachumgebung ungültig</translation>
     </message>
 </context>
 <context>
@@ -1129,20 +1184,24 @@ Mit Ihren Änderungen überschreiben, neu laden und Ihre Änderungen verwerfen, 
         <translation>Programm öffnen</translation>
     </message>
     <message>
-        <source>File doesn't exist</source>
+        <source>File doesn&apos;t exist</source>
         <translation>Datei existiert nicht</translation>
     </message>
     <message>
-        <source>File you have selected doesn't exist. Do you want to choose another one?</source>
+        <source>File you have selected doesn&apos;t exist. Do you want to choose another one?</source>
         <translation>Die gewählte Datei existiert nicht. Eine andere wählen?</translation>
     </message>
     <message>
-        <source>File isn't executable</source>
+        <source>File isn&apos;t executable</source>
         <translation>Datei ist nicht ausführbar</translation>
     </message>
     <message>
-        <source>You can't exec selected file. Do you want to choose another one?</source>
+        <source>You can&apos;t exec selected file. Do you want to choose another one?</source>
         <translation>Die gewählte Datei kann nicht ausgeführt werden. Eine andere wählen?</translation>
+    </message>
+    <message>
+        <source>Attention</source>
+        <translation>Achtung</translation>
     </message>
 </context>
 <context>
@@ -1171,7 +1230,7 @@ Mit Ihren Änderungen überschreiben, neu laden und Ihre Änderungen verwerfen, 
         <translation>unbekannte Option %1</translation>
     </message>
     <message>
-        <source>cannot read the key "%1"</source>
+        <source>cannot read the key &quot;%1&quot;</source>
         <translation>das Kürzel „%1“ ist nicht lesbar</translation>
     </message>
     <message>
@@ -1183,15 +1242,11 @@ Mit Ihren Änderungen überschreiben, neu laden und Ihre Änderungen verwerfen, 
         <translation>das Kürzel %1 ist nicht lesbar</translation>
     </message>
     <message>
-        <source>the key %1 is on line %2 too; only this line counts</source>
-        <translation>das Kürzel %1 steht auch in Zeile %2; nur diese Zeile gilt</translation>
-    </message>
-    <message>
         <source>%1 is no function of the window manager</source>
         <translation>%1 ist keine Funktion des Fenstermanagers</translation>
     </message>
     <message>
-        <source>the program of "%1" is not installed</source>
+        <source>the program of &quot;%1&quot; is not installed</source>
         <translation>das Programm von „%1“ ist nicht installiert</translation>
     </message>
     <message>
@@ -1211,10 +1266,6 @@ Mit Ihren Änderungen überschreiben, neu laden und Ihre Änderungen verwerfen, 
         <translation>kein Kürzel belegt %1</translation>
     </message>
     <message>
-        <source>the file name holds control characters</source>
-        <translation>der Dateiname enthält Steuerzeichen</translation>
-    </message>
-    <message>
         <source>no X display; the window manager cannot be told</source>
         <translation>kein X-Bildschirm; der Fenstermanager ist nicht erreichbar</translation>
     </message>
@@ -1225,6 +1276,14 @@ Mit Ihren Änderungen überschreiben, neu laden und Ihre Änderungen verwerfen, 
     <message>
         <source>--file needs a file name</source>
         <translation>--file braucht einen Dateinamen</translation>
+    </message>
+    <message>
+        <source>the key %1 does not count: line %2 binds the same key</source>
+        <translation>die Taste %1 zählt nicht: Zeile %2 belegt dieselbe Taste</translation>
+    </message>
+    <message>
+        <source>the argument %1 is not valid in the locale&apos;s encoding</source>
+        <translation>das Argument %1 ist in der Kodierung der Sprachumgebung ungültig</translation>
     </message>
 </context>
 <context>

@@ -1,4 +1,5 @@
-<?xml version='1.0' encoding='utf-8'?>
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
 <TS version="2.1" language="es_ES">
 <context>
     <name>Handbook</name>
@@ -7,7 +8,7 @@
         <translation>Manual del editor de atajos de Zem</translation>
     </message>
     <message>
-        <source>&lt;h2&gt;Zem hotkeys editor&lt;/h2&gt;&lt;p&gt;The editor shows every function of the zem-wm window manager in its group, and below &lt;i&gt;Command Keybindings&lt;/i&gt; the command lines of your own, each with its key. &lt;b&gt;Current Key&lt;/b&gt; is the key combination that starts it; &lt;b&gt;Source&lt;/b&gt; says whether the binding comes from your own hotkeys file (&lt;i&gt;user&lt;/i&gt;) or from the system-wide one (&lt;i&gt;system&lt;/i&gt;), which gives every user's defaults.&lt;/p&gt;</source>
+        <source>&lt;h2&gt;Zem hotkeys editor&lt;/h2&gt;&lt;p&gt;The editor shows every function of the zem-wm window manager in its group, and below &lt;i&gt;Command Keybindings&lt;/i&gt; the command lines of your own, each with its key. &lt;b&gt;Current Key&lt;/b&gt; is the key combination that starts it; &lt;b&gt;Source&lt;/b&gt; says whether the binding comes from your own hotkeys file (&lt;i&gt;user&lt;/i&gt;) or from the system-wide one (&lt;i&gt;system&lt;/i&gt;), which gives every user&apos;s defaults.&lt;/p&gt;</source>
         <translation>&lt;h2&gt;Editor de atajos de Zem&lt;/h2&gt;&lt;p&gt;El editor muestra cada función del gestor de ventanas zem-wm en su grupo y, bajo &lt;i&gt;Atajos de órdenes&lt;/i&gt;, sus propias líneas de órdenes, cada una con su atajo. &lt;b&gt;Atajo actual&lt;/b&gt; es la combinación que la lanza; &lt;b&gt;Origen&lt;/b&gt; indica si el atajo viene de su propio archivo (&lt;i&gt;usuario&lt;/i&gt;) o del archivo del sistema (&lt;i&gt;sistema&lt;/i&gt;), que da los valores predeterminados de todos los usuarios.&lt;/p&gt;</translation>
     </message>
     <message>
@@ -50,16 +51,60 @@
         <translation>El archivo contiene bytes NUL</translation>
     </message>
     <message>
-        <source>The key "%1" cannot be written to a hotkeys file</source>
+        <source>The key &quot;%1&quot; cannot be written to a hotkeys file</source>
         <translation>El atajo «%1» no se puede escribir en un archivo de atajos</translation>
     </message>
     <message>
-        <source>The action "%1" cannot be written to a hotkeys file</source>
+        <source>The action &quot;%1&quot; cannot be written to a hotkeys file</source>
         <translation>La acción «%1» no se puede escribir en un archivo de atajos</translation>
     </message>
     <message>
         <source>No [ShortCutKeys] section</source>
         <translation>Sin sección [ShortCutKeys]</translation>
+    </message>
+    <message>
+        <source>The command is empty</source>
+        <translation>La orden está vacía</translation>
+    </message>
+    <message>
+        <source>The command holds the control character %1, which a hotkeys file cannot hold</source>
+        <translation>La orden contiene el carácter de control %1, que un archivo de atajos no puede contener</translation>
+    </message>
+    <message>
+        <source>The file name holds control characters</source>
+        <translation>El nombre de archivo contiene caracteres de control</translation>
+    </message>
+    <message>
+        <source>The file name cannot be written in the locale&apos;s encoding</source>
+        <translation>El nombre de archivo no se puede escribir en la codificación de la configuración regional</translation>
+    </message>
+    <message>
+        <source>The file name is too long to be handed to the window manager</source>
+        <translation>El nombre de archivo es demasiado largo para pasarlo al gestor de ventanas</translation>
+    </message>
+    <message>
+        <source>%1 is a symbolic link of another account</source>
+        <translation>%1 es un enlace simbólico de otra cuenta</translation>
+    </message>
+    <message>
+        <source>%1 is read-only: its owner&apos;s write permission is off</source>
+        <translation>%1 es de solo lectura: su propietario no tiene permiso de escritura</translation>
+    </message>
+    <message>
+        <source>%1 belongs to another account</source>
+        <translation>%1 pertenece a otra cuenta</translation>
+    </message>
+    <message>
+        <source>%1 has %2 hard links; replacing it would part it from the others</source>
+        <translation>%1 tiene %2 enlaces duros; reemplazarlo lo separaría de los demás</translation>
+    </message>
+    <message>
+        <source>The file would be larger than 16 MiB</source>
+        <translation>El archivo superaría los 16 MiB</translation>
+    </message>
+    <message>
+        <source>Another program is writing a hotkeys file in %1; gave up waiting after %2 seconds</source>
+        <translation>Otro programa está escribiendo un archivo de atajos en %1; se dejó de esperar tras %2 segundos</translation>
     </message>
 </context>
 <context>
@@ -752,7 +797,7 @@
     </message>
     <message>
         <source>Command Keybindings</source>
-        <extracomment>The group row under which the user's command entries are listed.</extracomment>
+        <extracomment>The group row under which the user&apos;s command entries are listed.</extracomment>
         <translation>Atajos de órdenes</translation>
     </message>
     <message>
@@ -808,7 +853,7 @@
         <translation>&amp;Restaurar…</translation>
     </message>
     <message>
-        <source>Restore user's keyshortcutrc file from system one</source>
+        <source>Restore user&apos;s keyshortcutrc file from system one</source>
         <translation>Restaurar el archivo keyshortcutrc del usuario a partir del del sistema</translation>
     </message>
     <message>
@@ -919,7 +964,7 @@
         <translation>Error</translation>
     </message>
     <message>
-        <source>Can't create file </source>
+        <source>Can&apos;t create file </source>
         <translation>No se puede crear el archivo </translation>
     </message>
     <message>
@@ -927,7 +972,7 @@
         <translation>El archivo ocupa más de 16 MiB</translation>
     </message>
     <message>
-        <source>Can't copy %1
+        <source>Can&apos;t copy %1
 to %2</source>
         <translation>No se puede copiar %1
 a %2</translation>
@@ -941,13 +986,13 @@ a %2</translation>
         <translation>Atención</translation>
     </message>
     <message>
-        <source>Can't parse file:
+        <source>Can&apos;t parse file:
 %1</source>
         <translation>No se puede leer el archivo:
 %1</translation>
     </message>
     <message>
-        <source>Can't save in file </source>
+        <source>Can&apos;t save in file </source>
         <translation>No se puede guardar en el archivo </translation>
     </message>
     <message>
@@ -965,18 +1010,12 @@ Se perderán todos sus atajos propios.</translation>
         <translation>Se perderán todos los cambios. ¿Guardarlos?</translation>
     </message>
     <message>
-        <source>The window manager cannot be told to use this file: its name holds control characters or is too long.
-Save it under another name.</source>
-        <translation>No se puede indicar este archivo al gestor de ventanas: su nombre contiene caracteres de control o es demasiado largo.
-Guárdelo con otro nombre.</translation>
-    </message>
-    <message>
         <source>Warning</source>
         <translation>Advertencia</translation>
     </message>
     <message>
-        <source>You current file is "%1".
-After restart zem-wm will use "%2".</source>
+        <source>You current file is &quot;%1&quot;.
+After restart zem-wm will use &quot;%2&quot;.</source>
         <translation>El archivo actual es «%1».
 Tras reiniciar, zem-wm usará «%2».</translation>
     </message>
@@ -998,7 +1037,7 @@ Tras reiniciar, zem-wm usará «%2».</translation>
     </message>
     <message numerus="yes">
         <source>%1 of %n bindings</source>
-        <extracomment>Shown while a filter is active, for example "3 of 186 bindings".</extracomment>
+        <extracomment>Shown while a filter is active, for example &quot;3 of 186 bindings&quot;.</extracomment>
         <translation>
             <numerusform>%1 de %n atajo</numerusform>
             <numerusform>%1 de %n atajos</numerusform>
@@ -1026,7 +1065,7 @@ Tras reiniciar, zem-wm usará «%2».</translation>
     </message>
     <message>
         <source>command</source>
-        <extracomment>Names a command entry in "to the %2 action (%3)", where %3 is its command line.</extracomment>
+        <extracomment>Names a command entry in &quot;to the %2 action (%3)&quot;, where %3 is its command line.</extracomment>
         <translation>orden</translation>
     </message>
     <message>
@@ -1076,6 +1115,18 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <source>Reload</source>
         <translation>Recargar</translation>
     </message>
+    <message>
+        <source>The window manager cannot be told to use this file.
+Save it under another name.</source>
+        <translation>No se puede indicar este archivo al gestor de ventanas.
+Guárdelo con otro nombre.</translation>
+    </message>
+    <message>
+        <source>The system hotkeys file %1 was changed by another program since it was loaded.
+Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
+        <translation>Otro programa cambió el archivo de atajos del sistema %1 desde que se cargó.
+¿Sobrescribir %2 con sus cambios, recargar ambos y descartarlos, o cancelar?</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -1090,7 +1141,7 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <translation>Advertencia</translation>
     </message>
     <message>
-        <source>File %1 doesn't exist. Create?</source>
+        <source>File %1 doesn&apos;t exist. Create?</source>
         <translation>El archivo %1 no existe. ¿Crearlo?</translation>
     </message>
     <message>
@@ -1098,16 +1149,20 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <translation>Atención</translation>
     </message>
     <message>
-        <source>Can't open/create file:
+        <source>Can&apos;t open/create file:
 %1</source>
         <translation>No se puede abrir/crear el archivo:
 %1</translation>
     </message>
     <message>
-        <source>Can't parse file:
+        <source>Can&apos;t parse file:
 %1</source>
         <translation>No se puede leer el archivo:
 %1</translation>
+    </message>
+    <message>
+        <source>the file name is not valid in the locale&apos;s encoding</source>
+        <translation>el nombre de archivo no es válido en la codificación de la configuración regional</translation>
     </message>
 </context>
 <context>
@@ -1129,20 +1184,24 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <translation>Abrir un ejecutable</translation>
     </message>
     <message>
-        <source>File doesn't exist</source>
+        <source>File doesn&apos;t exist</source>
         <translation>El archivo no existe</translation>
     </message>
     <message>
-        <source>File you have selected doesn't exist. Do you want to choose another one?</source>
+        <source>File you have selected doesn&apos;t exist. Do you want to choose another one?</source>
         <translation>El archivo elegido no existe. ¿Quiere elegir otro?</translation>
     </message>
     <message>
-        <source>File isn't executable</source>
+        <source>File isn&apos;t executable</source>
         <translation>El archivo no es ejecutable</translation>
     </message>
     <message>
-        <source>You can't exec selected file. Do you want to choose another one?</source>
+        <source>You can&apos;t exec selected file. Do you want to choose another one?</source>
         <translation>El archivo elegido no se puede ejecutar. ¿Quiere elegir otro?</translation>
+    </message>
+    <message>
+        <source>Attention</source>
+        <translation>Atención</translation>
     </message>
 </context>
 <context>
@@ -1171,7 +1230,7 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <translation>opción desconocida %1</translation>
     </message>
     <message>
-        <source>cannot read the key "%1"</source>
+        <source>cannot read the key &quot;%1&quot;</source>
         <translation>no se puede leer el atajo «%1»</translation>
     </message>
     <message>
@@ -1183,15 +1242,11 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <translation>el atajo %1 no se puede leer</translation>
     </message>
     <message>
-        <source>the key %1 is on line %2 too; only this line counts</source>
-        <translation>el atajo %1 está también en la línea %2; solo cuenta esta línea</translation>
-    </message>
-    <message>
         <source>%1 is no function of the window manager</source>
         <translation>%1 no es una función del gestor de ventanas</translation>
     </message>
     <message>
-        <source>the program of "%1" is not installed</source>
+        <source>the program of &quot;%1&quot; is not installed</source>
         <translation>el programa de «%1» no está instalado</translation>
     </message>
     <message>
@@ -1211,10 +1266,6 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <translation>ningún atajo usa %1</translation>
     </message>
     <message>
-        <source>the file name holds control characters</source>
-        <translation>el nombre del archivo contiene caracteres de control</translation>
-    </message>
-    <message>
         <source>no X display; the window manager cannot be told</source>
         <translation>no hay pantalla X; no se puede avisar al gestor de ventanas</translation>
     </message>
@@ -1225,6 +1276,14 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
     <message>
         <source>--file needs a file name</source>
         <translation>--file necesita un nombre de archivo</translation>
+    </message>
+    <message>
+        <source>the key %1 does not count: line %2 binds the same key</source>
+        <translation>la tecla %1 no cuenta: la línea %2 asigna la misma tecla</translation>
+    </message>
+    <message>
+        <source>the argument %1 is not valid in the locale&apos;s encoding</source>
+        <translation>el argumento %1 no es válido en la codificación de la configuración regional</translation>
     </message>
 </context>
 <context>

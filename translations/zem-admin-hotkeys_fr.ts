@@ -1,4 +1,5 @@
-<?xml version='1.0' encoding='utf-8'?>
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
 <TS version="2.1" language="fr_FR">
 <context>
     <name>Handbook</name>
@@ -7,7 +8,7 @@
         <translation>Manuel de l’éditeur de raccourcis Zem</translation>
     </message>
     <message>
-        <source>&lt;h2&gt;Zem hotkeys editor&lt;/h2&gt;&lt;p&gt;The editor shows every function of the zem-wm window manager in its group, and below &lt;i&gt;Command Keybindings&lt;/i&gt; the command lines of your own, each with its key. &lt;b&gt;Current Key&lt;/b&gt; is the key combination that starts it; &lt;b&gt;Source&lt;/b&gt; says whether the binding comes from your own hotkeys file (&lt;i&gt;user&lt;/i&gt;) or from the system-wide one (&lt;i&gt;system&lt;/i&gt;), which gives every user's defaults.&lt;/p&gt;</source>
+        <source>&lt;h2&gt;Zem hotkeys editor&lt;/h2&gt;&lt;p&gt;The editor shows every function of the zem-wm window manager in its group, and below &lt;i&gt;Command Keybindings&lt;/i&gt; the command lines of your own, each with its key. &lt;b&gt;Current Key&lt;/b&gt; is the key combination that starts it; &lt;b&gt;Source&lt;/b&gt; says whether the binding comes from your own hotkeys file (&lt;i&gt;user&lt;/i&gt;) or from the system-wide one (&lt;i&gt;system&lt;/i&gt;), which gives every user&apos;s defaults.&lt;/p&gt;</source>
         <translation>&lt;h2&gt;Éditeur de raccourcis Zem&lt;/h2&gt;&lt;p&gt;L’éditeur montre chaque fonction du gestionnaire de fenêtres zem-wm dans son groupe et, sous &lt;i&gt;Raccourcis de commandes&lt;/i&gt;, vos propres lignes de commande, chacune avec son raccourci. &lt;b&gt;Raccourci actuel&lt;/b&gt; est la combinaison qui la déclenche ; &lt;b&gt;Source&lt;/b&gt; indique si le raccourci vient de votre propre fichier (&lt;i&gt;utilisateur&lt;/i&gt;) ou de celui du système (&lt;i&gt;système&lt;/i&gt;), qui donne les valeurs par défaut de tous les utilisateurs.&lt;/p&gt;</translation>
     </message>
     <message>
@@ -50,16 +51,60 @@
         <translation>Le fichier contient des octets NUL</translation>
     </message>
     <message>
-        <source>The key "%1" cannot be written to a hotkeys file</source>
+        <source>The key &quot;%1&quot; cannot be written to a hotkeys file</source>
         <translation>Le raccourci « %1 » ne peut pas être écrit dans un fichier de raccourcis</translation>
     </message>
     <message>
-        <source>The action "%1" cannot be written to a hotkeys file</source>
+        <source>The action &quot;%1&quot; cannot be written to a hotkeys file</source>
         <translation>L’action « %1 » ne peut pas être écrite dans un fichier de raccourcis</translation>
     </message>
     <message>
         <source>No [ShortCutKeys] section</source>
         <translation>Aucune section [ShortCutKeys]</translation>
+    </message>
+    <message>
+        <source>The command is empty</source>
+        <translation>La commande est vide</translation>
+    </message>
+    <message>
+        <source>The command holds the control character %1, which a hotkeys file cannot hold</source>
+        <translation>La commande contient le caractère de contrôle %1, qu&apos;un fichier de raccourcis ne peut pas contenir</translation>
+    </message>
+    <message>
+        <source>The file name holds control characters</source>
+        <translation>Le nom de fichier contient des caractères de contrôle</translation>
+    </message>
+    <message>
+        <source>The file name cannot be written in the locale&apos;s encoding</source>
+        <translation>Le nom de fichier ne peut pas s&apos;écrire dans l&apos;encodage de la locale</translation>
+    </message>
+    <message>
+        <source>The file name is too long to be handed to the window manager</source>
+        <translation>Le nom de fichier est trop long pour être transmis au gestionnaire de fenêtres</translation>
+    </message>
+    <message>
+        <source>%1 is a symbolic link of another account</source>
+        <translation>%1 est un lien symbolique d&apos;un autre compte</translation>
+    </message>
+    <message>
+        <source>%1 is read-only: its owner&apos;s write permission is off</source>
+        <translation>%1 est en lecture seule : son propriétaire n&apos;a pas le droit d&apos;écriture</translation>
+    </message>
+    <message>
+        <source>%1 belongs to another account</source>
+        <translation>%1 appartient à un autre compte</translation>
+    </message>
+    <message>
+        <source>%1 has %2 hard links; replacing it would part it from the others</source>
+        <translation>%1 a %2 liens physiques ; le remplacer le séparerait des autres</translation>
+    </message>
+    <message>
+        <source>The file would be larger than 16 MiB</source>
+        <translation>Le fichier dépasserait 16 Mio</translation>
+    </message>
+    <message>
+        <source>Another program is writing a hotkeys file in %1; gave up waiting after %2 seconds</source>
+        <translation>Un autre programme écrit un fichier de raccourcis dans %1 ; abandon après %2 secondes d&apos;attente</translation>
     </message>
 </context>
 <context>
@@ -752,7 +797,7 @@
     </message>
     <message>
         <source>Command Keybindings</source>
-        <extracomment>The group row under which the user's command entries are listed.</extracomment>
+        <extracomment>The group row under which the user&apos;s command entries are listed.</extracomment>
         <translation>Raccourcis de commandes</translation>
     </message>
     <message>
@@ -808,7 +853,7 @@
         <translation>&amp;Restaurer…</translation>
     </message>
     <message>
-        <source>Restore user's keyshortcutrc file from system one</source>
+        <source>Restore user&apos;s keyshortcutrc file from system one</source>
         <translation>Restaurer le fichier keyshortcutrc de l’utilisateur à partir de celui du système</translation>
     </message>
     <message>
@@ -919,7 +964,7 @@
         <translation>Erreur</translation>
     </message>
     <message>
-        <source>Can't create file </source>
+        <source>Can&apos;t create file </source>
         <translation>Impossible de créer le fichier </translation>
     </message>
     <message>
@@ -927,7 +972,7 @@
         <translation>Le fichier dépasse 16 Mio</translation>
     </message>
     <message>
-        <source>Can't copy %1
+        <source>Can&apos;t copy %1
 to %2</source>
         <translation>Impossible de copier %1
 vers %2</translation>
@@ -941,13 +986,13 @@ vers %2</translation>
         <translation>Attention</translation>
     </message>
     <message>
-        <source>Can't parse file:
+        <source>Can&apos;t parse file:
 %1</source>
         <translation>Impossible de lire le fichier :
 %1</translation>
     </message>
     <message>
-        <source>Can't save in file </source>
+        <source>Can&apos;t save in file </source>
         <translation>Impossible d’enregistrer dans le fichier </translation>
     </message>
     <message>
@@ -965,18 +1010,12 @@ Tous vos propres raccourcis qu’il contient seront perdus.</translation>
         <translation>Toutes les modifications seront perdues. Les enregistrer ?</translation>
     </message>
     <message>
-        <source>The window manager cannot be told to use this file: its name holds control characters or is too long.
-Save it under another name.</source>
-        <translation>Ce fichier ne peut pas être transmis au gestionnaire de fenêtres : son nom contient des caractères de contrôle ou est trop long.
-Enregistrez-le sous un autre nom.</translation>
-    </message>
-    <message>
         <source>Warning</source>
         <translation>Avertissement</translation>
     </message>
     <message>
-        <source>You current file is "%1".
-After restart zem-wm will use "%2".</source>
+        <source>You current file is &quot;%1&quot;.
+After restart zem-wm will use &quot;%2&quot;.</source>
         <translation>Le fichier actuel est « %1 ».
 Après un redémarrage, zem-wm utilisera « %2 ».</translation>
     </message>
@@ -998,7 +1037,7 @@ Après un redémarrage, zem-wm utilisera « %2 ».</translation>
     </message>
     <message numerus="yes">
         <source>%1 of %n bindings</source>
-        <extracomment>Shown while a filter is active, for example "3 of 186 bindings".</extracomment>
+        <extracomment>Shown while a filter is active, for example &quot;3 of 186 bindings&quot;.</extracomment>
         <translation>
             <numerusform>%1 sur %n raccourci</numerusform>
             <numerusform>%1 sur %n raccourcis</numerusform>
@@ -1026,7 +1065,7 @@ Après un redémarrage, zem-wm utilisera « %2 ».</translation>
     </message>
     <message>
         <source>command</source>
-        <extracomment>Names a command entry in "to the %2 action (%3)", where %3 is its command line.</extracomment>
+        <extracomment>Names a command entry in &quot;to the %2 action (%3)&quot;, where %3 is its command line.</extracomment>
         <translation>commande</translation>
     </message>
     <message>
@@ -1076,6 +1115,18 @@ L’écraser avec vos modifications, le recharger en les abandonnant, ou annuler
         <source>Reload</source>
         <translation>Recharger</translation>
     </message>
+    <message>
+        <source>The window manager cannot be told to use this file.
+Save it under another name.</source>
+        <translation>Impossible d&apos;indiquer ce fichier au gestionnaire de fenêtres.
+Enregistrez-le sous un autre nom.</translation>
+    </message>
+    <message>
+        <source>The system hotkeys file %1 was changed by another program since it was loaded.
+Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
+        <translation>Le fichier de raccourcis du système %1 a été modifié par un autre programme depuis son chargement.
+Écraser %2 avec vos modifications, recharger les deux et abandonner vos modifications, ou annuler ?</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -1090,7 +1141,7 @@ L’écraser avec vos modifications, le recharger en les abandonnant, ou annuler
         <translation>Avertissement</translation>
     </message>
     <message>
-        <source>File %1 doesn't exist. Create?</source>
+        <source>File %1 doesn&apos;t exist. Create?</source>
         <translation>Le fichier %1 n’existe pas. Le créer ?</translation>
     </message>
     <message>
@@ -1098,16 +1149,20 @@ L’écraser avec vos modifications, le recharger en les abandonnant, ou annuler
         <translation>Attention</translation>
     </message>
     <message>
-        <source>Can't open/create file:
+        <source>Can&apos;t open/create file:
 %1</source>
         <translation>Impossible d’ouvrir/créer le fichier :
 %1</translation>
     </message>
     <message>
-        <source>Can't parse file:
+        <source>Can&apos;t parse file:
 %1</source>
         <translation>Impossible de lire le fichier :
 %1</translation>
+    </message>
+    <message>
+        <source>the file name is not valid in the locale&apos;s encoding</source>
+        <translation>le nom de fichier n&apos;est pas valide dans l&apos;encodage de la locale</translation>
     </message>
 </context>
 <context>
@@ -1129,20 +1184,24 @@ L’écraser avec vos modifications, le recharger en les abandonnant, ou annuler
         <translation>Ouvrir un exécutable</translation>
     </message>
     <message>
-        <source>File doesn't exist</source>
+        <source>File doesn&apos;t exist</source>
         <translation>Le fichier n’existe pas</translation>
     </message>
     <message>
-        <source>File you have selected doesn't exist. Do you want to choose another one?</source>
+        <source>File you have selected doesn&apos;t exist. Do you want to choose another one?</source>
         <translation>Le fichier choisi n’existe pas. Voulez-vous en choisir un autre ?</translation>
     </message>
     <message>
-        <source>File isn't executable</source>
+        <source>File isn&apos;t executable</source>
         <translation>Le fichier n’est pas exécutable</translation>
     </message>
     <message>
-        <source>You can't exec selected file. Do you want to choose another one?</source>
+        <source>You can&apos;t exec selected file. Do you want to choose another one?</source>
         <translation>Le fichier choisi ne peut pas être exécuté. Voulez-vous en choisir un autre ?</translation>
+    </message>
+    <message>
+        <source>Attention</source>
+        <translation>Attention</translation>
     </message>
 </context>
 <context>
@@ -1171,7 +1230,7 @@ L’écraser avec vos modifications, le recharger en les abandonnant, ou annuler
         <translation>option inconnue %1</translation>
     </message>
     <message>
-        <source>cannot read the key "%1"</source>
+        <source>cannot read the key &quot;%1&quot;</source>
         <translation>impossible de lire le raccourci « %1 »</translation>
     </message>
     <message>
@@ -1183,15 +1242,11 @@ L’écraser avec vos modifications, le recharger en les abandonnant, ou annuler
         <translation>le raccourci %1 est illisible</translation>
     </message>
     <message>
-        <source>the key %1 is on line %2 too; only this line counts</source>
-        <translation>le raccourci %1 figure aussi à la ligne %2 ; seule cette ligne compte</translation>
-    </message>
-    <message>
         <source>%1 is no function of the window manager</source>
         <translation>%1 n’est pas une fonction du gestionnaire de fenêtres</translation>
     </message>
     <message>
-        <source>the program of "%1" is not installed</source>
+        <source>the program of &quot;%1&quot; is not installed</source>
         <translation>le programme de « %1 » n’est pas installé</translation>
     </message>
     <message>
@@ -1211,10 +1266,6 @@ L’écraser avec vos modifications, le recharger en les abandonnant, ou annuler
         <translation>aucun raccourci n’utilise %1</translation>
     </message>
     <message>
-        <source>the file name holds control characters</source>
-        <translation>le nom du fichier contient des caractères de contrôle</translation>
-    </message>
-    <message>
         <source>no X display; the window manager cannot be told</source>
         <translation>pas d’écran X ; le gestionnaire de fenêtres ne peut pas être prévenu</translation>
     </message>
@@ -1225,6 +1276,14 @@ L’écraser avec vos modifications, le recharger en les abandonnant, ou annuler
     <message>
         <source>--file needs a file name</source>
         <translation>--file demande un nom de fichier</translation>
+    </message>
+    <message>
+        <source>the key %1 does not count: line %2 binds the same key</source>
+        <translation>la touche %1 ne compte pas : la ligne %2 affecte la même touche</translation>
+    </message>
+    <message>
+        <source>the argument %1 is not valid in the locale&apos;s encoding</source>
+        <translation>l&apos;argument %1 n&apos;est pas valide dans l&apos;encodage de la locale</translation>
     </message>
 </context>
 <context>

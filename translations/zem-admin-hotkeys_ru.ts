@@ -1,4 +1,5 @@
-<?xml version='1.0' encoding='utf-8'?>
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
 <TS version="2.1" language="ru_RU">
 <context>
     <name>Handbook</name>
@@ -7,7 +8,7 @@
         <translation>Руководство редактора горячих клавиш Zem</translation>
     </message>
     <message>
-        <source>&lt;h2&gt;Zem hotkeys editor&lt;/h2&gt;&lt;p&gt;The editor shows every function of the zem-wm window manager in its group, and below &lt;i&gt;Command Keybindings&lt;/i&gt; the command lines of your own, each with its key. &lt;b&gt;Current Key&lt;/b&gt; is the key combination that starts it; &lt;b&gt;Source&lt;/b&gt; says whether the binding comes from your own hotkeys file (&lt;i&gt;user&lt;/i&gt;) or from the system-wide one (&lt;i&gt;system&lt;/i&gt;), which gives every user's defaults.&lt;/p&gt;</source>
+        <source>&lt;h2&gt;Zem hotkeys editor&lt;/h2&gt;&lt;p&gt;The editor shows every function of the zem-wm window manager in its group, and below &lt;i&gt;Command Keybindings&lt;/i&gt; the command lines of your own, each with its key. &lt;b&gt;Current Key&lt;/b&gt; is the key combination that starts it; &lt;b&gt;Source&lt;/b&gt; says whether the binding comes from your own hotkeys file (&lt;i&gt;user&lt;/i&gt;) or from the system-wide one (&lt;i&gt;system&lt;/i&gt;), which gives every user&apos;s defaults.&lt;/p&gt;</source>
         <translation>&lt;h2&gt;Редактор горячих клавиш Zem&lt;/h2&gt;&lt;p&gt;Редактор показывает каждую функцию оконного менеджера zem-wm в её группе, а в разделе &lt;i&gt;Сочетания для команд&lt;/i&gt; — ваши собственные команды, каждую с её сочетанием. &lt;b&gt;Текущее сочетание&lt;/b&gt; — комбинация клавиш, которая её запускает; &lt;b&gt;Источник&lt;/b&gt; говорит, взято ли сочетание из вашего собственного файла (&lt;i&gt;пользователь&lt;/i&gt;) или из системного (&lt;i&gt;система&lt;/i&gt;), который задаёт значения по умолчанию для всех пользователей.&lt;/p&gt;</translation>
     </message>
     <message>
@@ -50,16 +51,60 @@
         <translation>Файл содержит байты NUL</translation>
     </message>
     <message>
-        <source>The key "%1" cannot be written to a hotkeys file</source>
+        <source>The key &quot;%1&quot; cannot be written to a hotkeys file</source>
         <translation>Сочетание «%1» нельзя записать в файл горячих клавиш</translation>
     </message>
     <message>
-        <source>The action "%1" cannot be written to a hotkeys file</source>
+        <source>The action &quot;%1&quot; cannot be written to a hotkeys file</source>
         <translation>Действие «%1» нельзя записать в файл горячих клавиш</translation>
     </message>
     <message>
         <source>No [ShortCutKeys] section</source>
         <translation>Нет раздела [ShortCutKeys]</translation>
+    </message>
+    <message>
+        <source>The command is empty</source>
+        <translation>Команда пуста</translation>
+    </message>
+    <message>
+        <source>The command holds the control character %1, which a hotkeys file cannot hold</source>
+        <translation>Команда содержит управляющий символ %1, который файл горячих клавиш не может хранить</translation>
+    </message>
+    <message>
+        <source>The file name holds control characters</source>
+        <translation>Имя файла содержит управляющие символы</translation>
+    </message>
+    <message>
+        <source>The file name cannot be written in the locale&apos;s encoding</source>
+        <translation>Имя файла нельзя записать в кодировке локали</translation>
+    </message>
+    <message>
+        <source>The file name is too long to be handed to the window manager</source>
+        <translation>Имя файла слишком длинное, чтобы передать его оконному менеджеру</translation>
+    </message>
+    <message>
+        <source>%1 is a symbolic link of another account</source>
+        <translation>%1 — символическая ссылка другой учётной записи</translation>
+    </message>
+    <message>
+        <source>%1 is read-only: its owner&apos;s write permission is off</source>
+        <translation>%1 доступен только для чтения: у владельца нет права записи</translation>
+    </message>
+    <message>
+        <source>%1 belongs to another account</source>
+        <translation>%1 принадлежит другой учётной записи</translation>
+    </message>
+    <message>
+        <source>%1 has %2 hard links; replacing it would part it from the others</source>
+        <translation>У %1 %2 жёстких ссылки; замена отделила бы его от остальных</translation>
+    </message>
+    <message>
+        <source>The file would be larger than 16 MiB</source>
+        <translation>Файл стал бы больше 16 МиБ</translation>
+    </message>
+    <message>
+        <source>Another program is writing a hotkeys file in %1; gave up waiting after %2 seconds</source>
+        <translation>Другая программа записывает файл горячих клавиш в %1; ожидание прекращено через %2 с</translation>
     </message>
 </context>
 <context>
@@ -752,7 +797,7 @@
     </message>
     <message>
         <source>Command Keybindings</source>
-        <extracomment>The group row under which the user's command entries are listed.</extracomment>
+        <extracomment>The group row under which the user&apos;s command entries are listed.</extracomment>
         <translation>Сочетания для команд</translation>
     </message>
     <message>
@@ -808,7 +853,7 @@
         <translation>&amp;Восстановить…</translation>
     </message>
     <message>
-        <source>Restore user's keyshortcutrc file from system one</source>
+        <source>Restore user&apos;s keyshortcutrc file from system one</source>
         <translation>Восстановить файл keyshortcutrc пользователя из системного</translation>
     </message>
     <message>
@@ -920,7 +965,7 @@
         <translation>Ошибка</translation>
     </message>
     <message>
-        <source>Can't create file </source>
+        <source>Can&apos;t create file </source>
         <translation>Не удаётся создать файл </translation>
     </message>
     <message>
@@ -928,7 +973,7 @@
         <translation>Файл больше 16 МиБ</translation>
     </message>
     <message>
-        <source>Can't copy %1
+        <source>Can&apos;t copy %1
 to %2</source>
         <translation>Не удаётся скопировать %1
 в %2</translation>
@@ -942,13 +987,13 @@ to %2</source>
         <translation>Внимание</translation>
     </message>
     <message>
-        <source>Can't parse file:
+        <source>Can&apos;t parse file:
 %1</source>
         <translation>Не удаётся прочитать файл:
 %1</translation>
     </message>
     <message>
-        <source>Can't save in file </source>
+        <source>Can&apos;t save in file </source>
         <translation>Не удаётся сохранить в файл </translation>
     </message>
     <message>
@@ -966,18 +1011,12 @@ All your own bindings in it will be lost.</source>
         <translation>Все изменения будут потеряны. Сохранить их?</translation>
     </message>
     <message>
-        <source>The window manager cannot be told to use this file: its name holds control characters or is too long.
-Save it under another name.</source>
-        <translation>Этот файл нельзя передать оконному менеджеру: его имя содержит управляющие символы или слишком длинное.
-Сохраните его под другим именем.</translation>
-    </message>
-    <message>
         <source>Warning</source>
         <translation>Предупреждение</translation>
     </message>
     <message>
-        <source>You current file is "%1".
-After restart zem-wm will use "%2".</source>
+        <source>You current file is &quot;%1&quot;.
+After restart zem-wm will use &quot;%2&quot;.</source>
         <translation>Текущий файл — «%1».
 После перезапуска zem-wm будет использовать «%2».</translation>
     </message>
@@ -999,7 +1038,7 @@ After restart zem-wm will use "%2".</source>
     </message>
     <message numerus="yes">
         <source>%1 of %n bindings</source>
-        <extracomment>Shown while a filter is active, for example "3 of 186 bindings".</extracomment>
+        <extracomment>Shown while a filter is active, for example &quot;3 of 186 bindings&quot;.</extracomment>
         <translation>
             <numerusform>%1 из %n сочетания</numerusform>
             <numerusform>%1 из %n сочетаний</numerusform>
@@ -1028,7 +1067,7 @@ After restart zem-wm will use "%2".</source>
     </message>
     <message>
         <source>command</source>
-        <extracomment>Names a command entry in "to the %2 action (%3)", where %3 is its command line.</extracomment>
+        <extracomment>Names a command entry in &quot;to the %2 action (%3)&quot;, where %3 is its command line.</extracomment>
         <translation>команда</translation>
     </message>
     <message>
@@ -1078,6 +1117,18 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <source>Reload</source>
         <translation>Перечитать</translation>
     </message>
+    <message>
+        <source>The window manager cannot be told to use this file.
+Save it under another name.</source>
+        <translation>Оконному менеджеру нельзя передать этот файл.
+Сохраните его под другим именем.</translation>
+    </message>
+    <message>
+        <source>The system hotkeys file %1 was changed by another program since it was loaded.
+Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
+        <translation>Системный файл горячих клавиш %1 был изменён другой программой после загрузки.
+Перезаписать %2 вашими правками, перезагрузить оба и отбросить их или отменить?</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -1092,7 +1143,7 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <translation>Предупреждение</translation>
     </message>
     <message>
-        <source>File %1 doesn't exist. Create?</source>
+        <source>File %1 doesn&apos;t exist. Create?</source>
         <translation>Файл %1 не существует. Создать?</translation>
     </message>
     <message>
@@ -1100,16 +1151,20 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <translation>Внимание</translation>
     </message>
     <message>
-        <source>Can't open/create file:
+        <source>Can&apos;t open/create file:
 %1</source>
         <translation>Не удаётся открыть/создать файл:
 %1</translation>
     </message>
     <message>
-        <source>Can't parse file:
+        <source>Can&apos;t parse file:
 %1</source>
         <translation>Не удаётся прочитать файл:
 %1</translation>
+    </message>
+    <message>
+        <source>the file name is not valid in the locale&apos;s encoding</source>
+        <translation>имя файла недопустимо в кодировке локали</translation>
     </message>
 </context>
 <context>
@@ -1131,20 +1186,24 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <translation>Открыть исполняемый файл</translation>
     </message>
     <message>
-        <source>File doesn't exist</source>
+        <source>File doesn&apos;t exist</source>
         <translation>Файл не существует</translation>
     </message>
     <message>
-        <source>File you have selected doesn't exist. Do you want to choose another one?</source>
+        <source>File you have selected doesn&apos;t exist. Do you want to choose another one?</source>
         <translation>Выбранный файл не существует. Выбрать другой?</translation>
     </message>
     <message>
-        <source>File isn't executable</source>
+        <source>File isn&apos;t executable</source>
         <translation>Файл не исполняемый</translation>
     </message>
     <message>
-        <source>You can't exec selected file. Do you want to choose another one?</source>
+        <source>You can&apos;t exec selected file. Do you want to choose another one?</source>
         <translation>Выбранный файл нельзя запустить. Выбрать другой?</translation>
+    </message>
+    <message>
+        <source>Attention</source>
+        <translation>Внимание</translation>
     </message>
 </context>
 <context>
@@ -1173,7 +1232,7 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <translation>неизвестный параметр %1</translation>
     </message>
     <message>
-        <source>cannot read the key "%1"</source>
+        <source>cannot read the key &quot;%1&quot;</source>
         <translation>не удаётся прочитать сочетание «%1»</translation>
     </message>
     <message>
@@ -1185,15 +1244,11 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <translation>сочетание %1 не читается</translation>
     </message>
     <message>
-        <source>the key %1 is on line %2 too; only this line counts</source>
-        <translation>сочетание %1 есть и в строке %2; действует только эта строка</translation>
-    </message>
-    <message>
         <source>%1 is no function of the window manager</source>
         <translation>%1 — не функция оконного менеджера</translation>
     </message>
     <message>
-        <source>the program of "%1" is not installed</source>
+        <source>the program of &quot;%1&quot; is not installed</source>
         <translation>программа команды «%1» не установлена</translation>
     </message>
     <message>
@@ -1213,10 +1268,6 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
         <translation>%1 ничем не занято</translation>
     </message>
     <message>
-        <source>the file name holds control characters</source>
-        <translation>имя файла содержит управляющие символы</translation>
-    </message>
-    <message>
         <source>no X display; the window manager cannot be told</source>
         <translation>нет X-дисплея; оконному менеджеру нельзя сообщить</translation>
     </message>
@@ -1227,6 +1278,14 @@ Overwrite it with your edits, reload it and drop them, or cancel?</source>
     <message>
         <source>--file needs a file name</source>
         <translation>для --file нужно имя файла</translation>
+    </message>
+    <message>
+        <source>the key %1 does not count: line %2 binds the same key</source>
+        <translation>клавиша %1 не действует: строка %2 назначает ту же клавишу</translation>
+    </message>
+    <message>
+        <source>the argument %1 is not valid in the locale&apos;s encoding</source>
+        <translation>аргумент %1 недопустим в кодировке локали</translation>
     </message>
 </context>
 <context>
