@@ -522,8 +522,11 @@ void TestMainWindow::undoRedo()
 void TestMainWindow::undoRandomEdits()
 {
     // Any sequence of edits undone to the start gives the state loaded, and redone the state
-    // reached; and nothing is left to save at the start.
+    // reached; and nothing is left to save at the start. Saved, then undone and saved again, the
+    // file is the one loaded, byte for byte.
     QRandomGenerator random(20261206);
+    const QByteArray loaded = "[ShortCutKeys]\n; mine\r\nalt|f5 = ZEMWM_LOCK\r\nALT|F5=ZEMWM_EXIT\nCtrl|Alt|x=\"xclock\"";
+    QVERIFY(writeFile(userFile, loaded) && form->loadFile(userFile));
     const QStringList names{"ZEMWM_CLOSE", "ZEMWM_KILL", "ZEMWM_LOCK", "ZEMWM_EXIT", "cmd:xclock"};
     const QStringList keys{"Alt+F4", "Ctrl+K", "Alt+F5", "Ctrl+Alt+E", "Ctrl+Alt+X", "F9"};
     ModalAnswerer answerer({QMessageBox::Apply});
@@ -543,6 +546,12 @@ void TestMainWindow::undoRandomEdits()
     while (action("redoAction")->isEnabled())
         action("redoAction")->trigger();
     QCOMPARE(state(), end);
+    form->fileSave();
+    QVERIFY(readFile(userFile) != loaded);
+    while (action("undoAction")->isEnabled())
+        action("undoAction")->trigger();
+    form->fileSave();
+    QCOMPARE(readFile(userFile), loaded);
 }
 
 ZEM_TEST_MAIN(TestMainWindow)
