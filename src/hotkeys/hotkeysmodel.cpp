@@ -51,8 +51,11 @@ std::shared_ptr<const EntryOrigin> originOf(const HotkeysEntries& file, const Ke
     origin->rawValue = entry.value;
     origin->readAction = action;
     origin->editedFile = editedFile;
-    if (entry.counting >= 0)
+    if (entry.counting >= 0) {
         origin->lineNumber = file.lines().lines().at(entry.counting).number;
+        if (editedFile)
+            origin->line = entry.counting;
+    }
     return origin;
 }
 
@@ -99,6 +102,7 @@ struct Wanted
     int rank = -1;
     QString keyProblem;   // why the key cannot start a new line; empty when it can
     QString valueProblem; // why the value cannot be written; empty when it can
+    int fromLine = -1;    // the line of the edited file the binding was read from
 };
 
 } // namespace
@@ -581,6 +585,8 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
         }
         if (entry.valueProblem.isEmpty())
             entry.valueProblem = unwritableValue(entry.value);
+        if (origin && origin->editedFile)
+            entry.fromLine = origin->line;
         const bool placeholder = !isKeyIdentity(keyIdentity(row->fileKey));
         if (!isWritableFileKey(row->fileKey) ||
             (row->keyRecorded && !placeholder && !readsBackAsWritten(row->key)))
@@ -607,8 +613,16 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
     const HotkeysLines& lines = base->lines();
     const QVector<HotkeysLine>& all = lines.lines();
     QSet<int> removed;
-    QHash<int, QByteArray> rewritten;
+    QHash<int, QByteArray> rewritten; // new values
+    QHash<int, const Wanted*> rekeyed; // new keys and values
     QVector<const Wanted*> added;
+    // A binding given a key the file does not hold keeps the line it was read from, when no
+    // other binding wants that line's key: the line stays where it is, with its comment.
+    QHash<int, QByteArray> claims;
+    for (auto it = wanted.cbegin(); it != wanted.cend(); ++it) {
+        if (it->fromLine >= 0 && !base->find(it.key()) && !claims.contains(it->fromLine))
+            claims.insert(it->fromLine, it.key());
+    }
     for (const KeyEntry& entry : base->entries()) {
         const auto it = wanted.constFind(entry.identity);
         if (it != wanted.cend() && unquoted(it->value) == unquoted(entry.value))
@@ -616,7 +630,9 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
         for (int line : entry.others)
             removed.insert(line);
         if (it == wanted.cend()) {
-            if (entry.counting >= 0)
+            if (entry.counting >= 0 && claims.contains(entry.counting))
+                rekeyed.insert(entry.counting, &wanted[claims.value(entry.counting)]);
+            else if (entry.counting >= 0)
                 removed.insert(entry.counting);
             continue;
         }
@@ -629,11 +645,12 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
         else
             added.append(&*it);
     }
+    const QList<const Wanted*> moved = rekeyed.values();
     for (const QByteArray& identity : qAsConst(order)) {
-        if (!base->find(identity))
+        if (!base->find(identity) && !moved.contains(&wanted[identity]))
             added.append(&wanted[identity]);
     }
-    for (const Wanted* entry : qAsConst(added)) {
+    for (const Wanted* entry : added + moved.toVector()) {
         const QString problem = entry->keyProblem.isEmpty() ? entry->valueProblem : entry->keyProblem;
         if (!problem.isEmpty()) {
             *reason = problem;
@@ -655,7 +672,10 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
             header = i;
         if (all.at(i).kind == HotkeysLine::Entry && lines.isHotkeysSection(all.at(i).section) &&
             !removed.contains(i))
-            places.append({i, rankOf(rewritten.value(i, all.at(i).value)), nullptr});
+            places.append({i,
+                           rankOf(rekeyed.contains(i) ? rekeyed.value(i)->value
+                                                      : rewritten.value(i, all.at(i).value)),
+                           nullptr});
     }
     bool ordered = true;
     int highest = -1;
@@ -693,6 +713,8 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
         QByteArray own = lines.span(line.start, line.end);
         if (removed.contains(i))
             own.clear();
+        else if (rekeyed.contains(i))
+            own = rekeyed.value(i)->key + '=' + rekeyed.value(i)->value + lineEndOf(own);
         else if (rewritten.contains(i))
             own = lines.span(line.start, line.valueStart) + rewritten.value(i) +
                   lines.span(line.valueEnd, line.end);

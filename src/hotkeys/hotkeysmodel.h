@@ -26,6 +26,7 @@ struct EntryOrigin
     QByteArray rawValue; // the value as written, trimmed
     QString readAction;  // the action it was read as
     int lineNumber = 0;
+    int line = -1;           // edited file: the index of the line that counts among its lines
     bool editedFile = false; // read from the edited file, not the system file
 };
 

@@ -149,6 +149,13 @@ void TestHotkeysModel::writeBack_data()
         << "command|cmd:echo eq|echo EQ"
         << QByteArray("[ShortCutKeys]\nCtrl|Alt|KP_Equal=\"echo kp\"\nCtrl|Alt|equal=\"echo EQ\"\n");
     // What an edit keeps of its line.
+    const QByteArray commented = "[ShortCutKeys]\n; terminal\nCtrl|Alt|t=\"xterm\"\r\nAlt|F5=ZEMWM_LOCK\n";
+    QTest::newRow("a binding given a new key keeps its line, its place and its comment")
+        << commented << "key|cmd:xterm|Ctrl+Alt+Y"
+        << QByteArray("[ShortCutKeys]\n; terminal\nCtrl|Alt|y=\"xterm\"\r\nAlt|F5=ZEMWM_LOCK\n");
+    QTest::newRow("a command left without a key keeps its line under a placeholder")
+        << commented << "clear|cmd:xterm"
+        << QByteArray("[ShortCutKeys]\n; terminal\nNone|None0=\"xterm\"\r\nAlt|F5=ZEMWM_LOCK\n");
     QTest::newRow("a new key keeps the value's bytes")
         << QByteArray("[ShortCutKeys]\nCtrl|l=\"echo caf\xe9\"\n") << "key|cmd:echo caf\xef\xbf\xbd|Ctrl+E"
         << QByteArray("[ShortCutKeys]\nCtrl|e=\"echo caf\xe9\"\n");
