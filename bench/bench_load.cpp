@@ -7,8 +7,8 @@
 // for the given size and for twice that size, so that the growth can be read off.
 #include "functioncatalogue.h"
 #include "hotkeysfile.h"
-#include "keyforms.h"
 #include "hotkeysmodel.h"
+#include "keyforms.h"
 #include "keysconfform.h"
 
 #include <QApplication>

@@ -1,7 +1,7 @@
 #include "hotkeysfile.h"
-#include "safefile.h"
 #include "keysconfform.h"
 #include "myapplication.h"
+#include "safefile.h"
 #include "startup.h"
 #include "zemcore.h"
 
@@ -84,9 +84,10 @@ int main(int argc, char** argv)
         path = arguments.first();
         if (!isFaithfulFileName(QByteArray(argv[1]))) {
             // Read in the locale's encoding it names another file, which would be created.
-            std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n",
-                         printableText(QFile::decodeName(argv[1])).toLocal8Bit().constData(),
-                         QObject::tr("the file name is not valid in the locale's encoding").toLocal8Bit().constData());
+            std::fprintf(
+                stderr, "zem-admin-hotkeys: %s: %s\n",
+                printableText(QFile::decodeName(argv[1])).toLocal8Bit().constData(),
+                QObject::tr("the file name is not valid in the locale's encoding").toLocal8Bit().constData());
             delete form;
             delete app;
             return CreationDeclined;

@@ -5,10 +5,10 @@
 #include "hotkeysdocument.h"
 #include "hotkeysentries.h"
 #include "hotkeysfile.h"
-#include "safefile.h"
-#include "keyforms.h"
 #include "hotkeyslines.h"
 #include "hotkeysmodel.h"
+#include "keyforms.h"
+#include "safefile.h"
 #include "zemwmcommand.h"
 
 #include <QCoreApplication>
@@ -158,7 +158,8 @@ QByteArray readKey(const QString& text, QTextStream& err)
 {
     const QByteArray key = fileKeyFromTyped(text);
     if (key.isEmpty())
-        err << "zem-hotkeys: " << ZemHotkeys::tr("cannot read the key \"%1\"").arg(printableText(text)) << '\n';
+        err << "zem-hotkeys: " << ZemHotkeys::tr("cannot read the key \"%1\"").arg(printableText(text))
+            << '\n';
     return key;
 }
 
@@ -293,7 +294,8 @@ void checkFile(const QString& path, QVector<Finding>& findings)
                            .arg(overridden.value(i)));
         if (value.startsWith(QLatin1String("ZEMWM_"))) {
             if (!HotkeysModel::functionNames().contains(value))
-                say(true, ZemHotkeys::tr("%1 is no function of the window manager").arg(printableText(value)));
+                say(true,
+                    ZemHotkeys::tr("%1 is no function of the window manager").arg(printableText(value)));
         } else if (value != QLatin1String("Disable") && !programExists(value)) {
             say(false, ZemHotkeys::tr("the program of \"%1\" is not installed").arg(printableText(value)));
         }
@@ -319,8 +321,8 @@ int check(const Options& options, QTextStream& out)
                                        {"severity", severity},
                                        {"message", finding.text}});
         else
-            out << printableText(finding.path) << ':' << finding.line << ": " << severity << ": " << finding.text
-                << '\n';
+            out << printableText(finding.path) << ':' << finding.line << ": " << severity << ": "
+                << finding.text << '\n';
     }
     if (options.json)
         out << QJsonDocument(entries).toJson(QJsonDocument::Indented);
@@ -363,7 +365,8 @@ int set(const Options& options, QTextStream& out, QTextStream& err)
         return Failed;
     if (const Binding* holder = model.find(model.holderOfFileKey(key))) {
         if (describe(*holder) == target) {
-            out << ZemHotkeys::tr("%1 already does %2").arg(options.words.at(1), printableText(target)) << '\n';
+            out << ZemHotkeys::tr("%1 already does %2").arg(options.words.at(1), printableText(target))
+                << '\n';
             return 0;
         }
         if (!options.force) {
@@ -394,8 +397,8 @@ int unset(const Options& options, QTextStream& err)
         return Failed;
     const Binding* holder = model.find(model.holderOfFileKey(key));
     if (!holder) {
-        err << "zem-hotkeys: " << ZemHotkeys::tr("no binding holds %1").arg(printableText(options.words.at(1)))
-            << '\n';
+        err << "zem-hotkeys: "
+            << ZemHotkeys::tr("no binding holds %1").arg(printableText(options.words.at(1))) << '\n';
         return Failed;
     }
     // A function's only row stays, without its key; any other row goes.

@@ -3,6 +3,7 @@
 #include "functioncatalogue.h"
 #include "hotkeysentries.h"
 #include "hotkeysfile.h"
+#include "hotkeyspatch.h"
 #include "keyforms.h"
 
 #include <QCoreApplication>
@@ -59,30 +60,6 @@ std::shared_ptr<const EntryOrigin> originOf(const HotkeysEntries& file, const Ke
     return origin;
 }
 
-// Where a new line goes among the section's entries: the catalogue's order of functions, then
-// commands, then disabled keys; an unknown function has no place.
-int rankOf(const QByteArray& value)
-{
-    const QString action = unquoted(QString::fromLocal8Bit(value));
-    const int functions = HotkeysModel::functionNames().size();
-    if (action == disableValue)
-        return functions + 1;
-    if (action.startsWith(QLatin1String("ZEMWM_")))
-        return functionIndex().value(action, -1);
-    return functions;
-}
-
-QByteArray lineEndOf(const QByteArray& line)
-{
-    if (line.endsWith("\r\n"))
-        return "\r\n";
-    if (line.endsWith('\n'))
-        return "\n";
-    if (line.endsWith('\r'))
-        return "\r";
-    return QByteArray();
-}
-
 // Why a value of the editor's making cannot stand in the file; empty when it can.
 QString unwritableValue(const QByteArray& value)
 {
@@ -94,24 +71,13 @@ QString unwritableValue(const QByteArray& value)
     return QString();
 }
 
-// One entry that writing wants in the file.
-struct Wanted
-{
-    QByteArray key;
-    QByteArray value;
-    int rank = -1;
-    QString keyProblem;   // why the key cannot start a new line; empty when it can
-    QString valueProblem; // why the value cannot be written; empty when it can
-    int fromLine = -1;    // the line of the edited file the binding was read from
-};
-
 } // namespace
 
 HotkeysModel::HotkeysModel() : functionRows(functionNames().size()), base(emptyFile())
 {
     for (int f = 0; f < functionRows.size(); ++f)
-        functionRows[f].append(Binding{++lastId, f, QString(), QString(), QByteArray(), BindingSource::Unset,
-                                       nullptr, false});
+        functionRows[f].append(
+            Binding{++lastId, f, QString(), QString(), QByteArray(), BindingSource::Unset, nullptr, false});
 }
 
 const QStringList& HotkeysModel::functionNames()
@@ -445,15 +411,15 @@ QStringList HotkeysModel::revertToSystem(int function)
             heldElsewhere << binding.key;
             continue;
         }
-        rows.append(Binding{++lastId, function, QString(), binding.key, binding.fileKey, BindingSource::System,
-                            binding.origin, false});
+        rows.append(Binding{++lastId, function, QString(), binding.key, binding.fileKey,
+                            BindingSource::System, binding.origin, false});
         enable(binding.fileKey);
     }
     if (rows.size() > 2)
         std::reverse(rows.begin() + 1, rows.end());
     if (rows.isEmpty())
-        rows.append(
-            Binding{++lastId, function, QString(), QString(), QByteArray(), BindingSource::Unset, nullptr, false});
+        rows.append(Binding{++lastId, function, QString(), QString(), QByteArray(), BindingSource::Unset,
+                            nullptr, false});
     return heldElsewhere;
 }
 
@@ -490,8 +456,14 @@ BindingId HotkeysModel::cloneRow(BindingId id)
     const auto cloneIn = [&](QVector<Binding>& rows) -> BindingId {
         for (int i = 0; i < rows.size(); ++i) {
             if (rows.at(i).id == id) {
-                Binding copy{++lastId,     rows.at(i).function, rows.at(i).command, QString(),
-                             QByteArray(), BindingSource::User, nullptr,            false};
+                Binding copy{++lastId,
+                             rows.at(i).function,
+                             rows.at(i).command,
+                             QString(),
+                             QByteArray(),
+                             BindingSource::User,
+                             nullptr,
+                             false};
                 rows.insert(i + 1, copy);
                 return copy.id;
             }
@@ -553,8 +525,8 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
 
     // What the file is to mean: one entry per key, in the order of the rows.
     QVector<QByteArray> order;
-    QHash<QByteArray, Wanted> wanted;
-    const auto want = [&](const QByteArray& fileKey, Wanted entry, bool replace) {
+    QHash<QByteArray, WantedEntry> wanted;
+    const auto want = [&](const QByteArray& fileKey, WantedEntry entry, bool replace) {
         const QByteArray identity = keyIdentity(fileKey);
         const auto it = wanted.find(identity);
         if (it == wanted.end()) {
@@ -573,8 +545,8 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
             continue;
         const QString action = row->isCommand() ? row->command : functionNames().at(row->function);
         const EntryOrigin* origin = row->origin.get();
-        Wanted entry{row->fileKey, QByteArray(), row->isCommand() ? commandRank : row->function, QString(),
-                     QString()};
+        WantedEntry entry{row->fileKey, QByteArray(), row->isCommand() ? commandRank : row->function,
+                          QString(), QString()};
         if (origin && action == origin->readAction) {
             entry.value = origin->rawValue;
         } else if (row->isCommand()) {
@@ -596,142 +568,18 @@ bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
     }
     for (const DisabledKey& key : qAsConst(disabled)) {
         const EntryOrigin* origin = key.origin.get();
-        Wanted entry{key.fileKey, "\"Disable\"", commandRank + 1, QString(), QString()};
+        WantedEntry entry{key.fileKey, "\"Disable\"", commandRank + 1, QString(), QString()};
         if (origin && origin->readAction == disableValue)
             entry.value = origin->rawValue;
         if (!isWritableFileKey(key.fileKey))
             entry.keyProblem = HotkeysFile::tr("The key \"%1\" cannot be written to a hotkeys file")
-                                .arg(printableText(QString::fromLocal8Bit(key.fileKey)));
+                                   .arg(printableText(QString::fromLocal8Bit(key.fileKey)));
         want(key.fileKey, entry, true);
     }
     // What was read but not shown stays, unless a shown binding took its key since.
     for (const Kept& entry : qAsConst(kept))
-        want(entry.fileKey, Wanted{entry.fileKey, entry.origin->rawValue, -1, QString(), QString()}, false);
+        want(entry.fileKey, WantedEntry{entry.fileKey, entry.origin->rawValue, -1, QString(), QString()},
+             false);
 
-    // The file as read, and what changes in it: removed lines, values rewritten in place, new
-    // lines after the line they follow.
-    const HotkeysLines& lines = base->lines();
-    const QVector<HotkeysLine>& all = lines.lines();
-    QSet<int> removed;
-    QHash<int, QByteArray> rewritten; // new values
-    QHash<int, const Wanted*> rekeyed; // new keys and values
-    QVector<const Wanted*> added;
-    // A binding given a key the file does not hold keeps the line it was read from, when no
-    // other binding wants that line's key: the line stays where it is, with its comment.
-    QHash<int, QByteArray> claims;
-    for (auto it = wanted.cbegin(); it != wanted.cend(); ++it) {
-        if (it->fromLine >= 0 && !base->find(it.key()) && !claims.contains(it->fromLine))
-            claims.insert(it->fromLine, it.key());
-    }
-    for (const KeyEntry& entry : base->entries()) {
-        const auto it = wanted.constFind(entry.identity);
-        if (it != wanted.cend() && unquoted(it->value) == unquoted(entry.value))
-            continue; // the same meaning: every line of the key stays as written
-        for (int line : entry.others)
-            removed.insert(line);
-        if (it == wanted.cend()) {
-            if (entry.counting >= 0 && claims.contains(entry.counting))
-                rekeyed.insert(entry.counting, &wanted[claims.value(entry.counting)]);
-            else if (entry.counting >= 0)
-                removed.insert(entry.counting);
-            continue;
-        }
-        if (!it->valueProblem.isEmpty()) {
-            *reason = it->valueProblem;
-            return false;
-        }
-        if (entry.counting >= 0)
-            rewritten.insert(entry.counting, it->value);
-        else
-            added.append(&*it);
-    }
-    const QList<const Wanted*> moved = rekeyed.values();
-    for (const QByteArray& identity : qAsConst(order)) {
-        if (!base->find(identity) && !moved.contains(&wanted[identity]))
-            added.append(&wanted[identity]);
-    }
-    for (const Wanted* entry : added + moved.toVector()) {
-        const QString problem = entry->keyProblem.isEmpty() ? entry->valueProblem : entry->keyProblem;
-        if (!problem.isEmpty()) {
-            *reason = problem;
-            return false;
-        }
-    }
-
-    // The section's entry lines that stay, with their places for new lines.
-    struct Slot
-    {
-        int line; // -1 for a new line
-        int rank;
-        const Wanted* entry;
-    };
-    QVector<Slot> places;
-    int header = -1;
-    for (int i = 0; i < all.size(); ++i) {
-        if (header < 0 && lines.isHotkeysSection(i))
-            header = i;
-        if (all.at(i).kind == HotkeysLine::Entry && lines.isHotkeysSection(all.at(i).section) &&
-            !removed.contains(i))
-            places.append({i,
-                           rankOf(rekeyed.contains(i) ? rekeyed.value(i)->value
-                                                      : rewritten.value(i, all.at(i).value)),
-                           nullptr});
-    }
-    bool ordered = true;
-    int highest = -1;
-    for (const Slot& slot : qAsConst(places)) {
-        if (slot.rank < 0)
-            continue;
-        ordered = ordered && slot.rank >= highest;
-        highest = std::max(highest, slot.rank);
-    }
-    std::stable_sort(added.begin(), added.end(),
-                     [](const Wanted* a, const Wanted* b) { return a->rank < b->rank; });
-    for (const Wanted* entry : qAsConst(added)) {
-        int after = places.size() - 1;
-        if (ordered) {
-            while (after >= 0 && (places.at(after).rank < 0 || places.at(after).rank > entry->rank))
-                --after;
-        }
-        places.insert(after + 1, {-1, entry->rank, entry});
-    }
-    // Each new line follows the line kept before it, or the section's header when none is.
-    const auto firstKept = std::find_if(places.cbegin(), places.cend(), [](const Slot& s) { return s.line >= 0; });
-    QHash<int, QVector<const Wanted*>> following;
-    int anchor = firstKept == places.cend() ? header : all.at(firstKept->line).section;
-    for (const Slot& slot : qAsConst(places)) {
-        if (slot.line >= 0)
-            anchor = slot.line;
-        else
-            following[anchor].append(slot.entry);
-    }
-
-    QByteArray out = lines.span(0, all.isEmpty() ? lines.textStart() : lines.leadingStart(0));
-    for (int i = 0; i < all.size(); ++i) {
-        const HotkeysLine& line = all.at(i);
-        out += lines.span(lines.leadingStart(i), line.start);
-        QByteArray own = lines.span(line.start, line.end);
-        if (removed.contains(i))
-            own.clear();
-        else if (rekeyed.contains(i))
-            own = rekeyed.value(i)->key + '=' + rekeyed.value(i)->value + lineEndOf(own);
-        else if (rewritten.contains(i))
-            own = lines.span(line.start, line.valueStart) + rewritten.value(i) +
-                  lines.span(line.valueEnd, line.end);
-        const auto news = following.constFind(i);
-        if (news != following.cend()) {
-            QByteArray end = lineEndOf(own);
-            if (end.isEmpty()) {
-                // A last line without its line end gets one first.
-                end = "\n";
-                own += end;
-            }
-            for (const Wanted* entry : *news)
-                own += entry->key + '=' + entry->value + end;
-        }
-        out += own;
-    }
-    out += lines.trailing();
-    *bytes = out;
-    return true;
+    return HotkeysPatch(*base, order, wanted).apply(bytes, reason);
 }

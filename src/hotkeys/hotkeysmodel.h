@@ -34,9 +34,9 @@ struct EntryOrigin
 struct Binding
 {
     BindingId id = 0;
-    int function = -1; // index into HotkeysModel::functionNames(); -1 for a command
-    QString command;   // commands only
-    QString key;       // stored key: QKeySequence portable text, or text the key server could not read
+    int function = -1;  // index into HotkeysModel::functionNames(); -1 for a command
+    QString command;    // commands only
+    QString key;        // stored key: QKeySequence portable text, or text the key server could not read
     QByteArray fileKey; // the key as the file writes it; a placeholder for a keyless command
     BindingSource source = BindingSource::Unset;
     std::shared_ptr<const EntryOrigin> origin;

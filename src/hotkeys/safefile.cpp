@@ -68,8 +68,8 @@ QString plantedLink(const QString& path)
         if (::lstat(encoded(hop).constData(), &link) != 0 || !S_ISLNK(link.st_mode))
             return QString();
         struct stat dir;
-        if (link.st_uid != 0 &&
-            (::stat(encoded(QFileInfo(hop).absolutePath()).constData(), &dir) != 0 || dir.st_uid != link.st_uid))
+        if (link.st_uid != 0 && (::stat(encoded(QFileInfo(hop).absolutePath()).constData(), &dir) != 0 ||
+                                 dir.st_uid != link.st_uid))
             return HotkeysFile::tr("%1 is a symbolic link of another account").arg(hop);
         hop = QFileInfo(hop).symLinkTarget();
     }

@@ -148,7 +148,8 @@ bool KeysConfForm::loadFile(const QString& path)
         return false;
     const QString systemPath = path == userHotkeysFilePath() ? systemHotkeysFilePath() : QString();
     if (!model.load(path, systemPath, &failedPath, &loadError)) {
-        std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n", printableText(failedPath).toLocal8Bit().constData(),
+        std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n",
+                     printableText(failedPath).toLocal8Bit().constData(),
                      loadError.toLocal8Bit().constData());
         return false;
     }
@@ -308,7 +309,8 @@ void KeysConfForm::fileApply()
     if (command.isEmpty()) {
         QMessageBox::warning(this, tr("Error"),
                              tr("The window manager cannot be told to use this file.\nSave it under another "
-                                "name.") + QLatin1Char('\n') + problem,
+                                "name.") +
+                                 QLatin1Char('\n') + problem,
                              QMessageBox::Ok);
         return;
     }

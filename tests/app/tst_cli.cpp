@@ -72,7 +72,8 @@ int TestCli::run(const QStringList& arguments, bool display, const QStringList& 
     if (launcher.isEmpty())
         process.start(QStringLiteral(ZEM_CLI_BINARY), arguments);
     else
-        process.start(launcher.first(), launcher.mid(1) + QStringList{QStringLiteral(ZEM_CLI_BINARY)} + arguments);
+        process.start(launcher.first(),
+                      launcher.mid(1) + QStringList{QStringLiteral(ZEM_CLI_BINARY)} + arguments);
     process.waitForFinished(10000);
     out = process.readAllStandardOutput();
     err = process.readAllStandardError();
@@ -163,8 +164,8 @@ void TestCli::edit_data()
     QTest::newRow("an empty command") << QStringList{"set", "Alt+F9", " "} << 2 << untouched;
     QTest::newRow("a control character in a command")
         << QStringList{"set", "Alt+F9", "xterm\n-e rm"} << 2 << untouched;
-    QTest::newRow("--file= without a name") << QStringList{"set", "Alt+F9", "xclock", "--file="} << 64
-                                            << untouched;
+    QTest::newRow("--file= without a name")
+        << QStringList{"set", "Alt+F9", "xclock", "--file="} << 64 << untouched;
     QTest::newRow("set a key another binding holds")
         << QStringList{"set", "Alt|F4", "ZEMWM_EXIT"} << 3 << untouched;
     QTest::newRow("--force takes it over, the system binding switched off")
@@ -222,8 +223,9 @@ void TestCli::concurrentWriters()
         }
         const QByteArray file = read(QStringLiteral("user/keyshortcutrc"));
         for (int w = 0; w < writers; ++w)
-            QVERIFY2(file.contains(QStringLiteral("Ctrl|Alt|F%1=\"xclock -%2\"").arg(w + 1).arg(w).toLatin1()),
-                     qPrintable(QStringLiteral("round %1:\n%2").arg(round).arg(QString::fromLatin1(file))));
+            QVERIFY2(
+                file.contains(QStringLiteral("Ctrl|Alt|F%1=\"xclock -%2\"").arg(w + 1).arg(w).toLatin1()),
+                qPrintable(QStringLiteral("round %1:\n%2").arg(round).arg(QString::fromLatin1(file))));
     }
 }
 
@@ -240,8 +242,9 @@ void TestCli::anotherAccountsFile()
     const QByteArray before = read(QStringLiteral("roots.rc"));
     QCOMPARE(run({QStringLiteral("set"), QStringLiteral("Alt+F6"), QStringLiteral("ZEMWM_EXIT"),
                   QStringLiteral("--file"), path},
-                 false, {QStringLiteral("setpriv"), QStringLiteral("--reuid=65534"), QStringLiteral("--regid=65534"),
-                         QStringLiteral("--clear-groups")}),
+                 false,
+                 {QStringLiteral("setpriv"), QStringLiteral("--reuid=65534"), QStringLiteral("--regid=65534"),
+                  QStringLiteral("--clear-groups")}),
              2);
     QVERIFY2(err.contains("belongs to another account"), err);
     QCOMPARE(read(QStringLiteral("roots.rc")), before);
@@ -266,14 +269,16 @@ void TestCli::applyAndUsage()
     // sent as it is.
     write(QStringLiteral("not.rc"), "!a=b\n");
     const QString tooLong = QLatin1Char('/') + QString(5000, QLatin1Char('x'));
-    for (const QString& file : {dir.filePath(QStringLiteral("missing.rc")), dir.filePath(QStringLiteral("not.rc")), tooLong}) {
+    for (const QString& file :
+         {dir.filePath(QStringLiteral("missing.rc")), dir.filePath(QStringLiteral("not.rc")), tooLong}) {
         QCOMPARE(run({QStringLiteral("apply"), file}, true), 2);
         QVERIFY(err.startsWith("zem-hotkeys: "));
     }
     QVERIFY(err.contains("too long"));
     // A byte that is no UTF-8, given as it stands.
     QCOMPARE(run({}, true,
-                 {QStringLiteral("sh"), QStringLiteral("-c"), QStringLiteral("exec \"$0\" apply \"$(printf 'bad\\377')\"")}),
+                 {QStringLiteral("sh"), QStringLiteral("-c"),
+                  QStringLiteral("exec \"$0\" apply \"$(printf 'bad\\377')\"")}),
              2);
     QVERIFY2(err.contains("not valid in the locale's encoding"), err);
     xprop.start(QStringLiteral("xprop"), QStringLiteral("-root -notype _ZEMWM_COMMAND").split(' '));

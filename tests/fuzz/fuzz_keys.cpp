@@ -39,7 +39,8 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size)
     if (keyIdentity(raw) != keyIdentity(foldedKey(raw)))
         std::abort();
     const QByteArray typed = fileKeyFromTyped(QString::fromLatin1(raw));
-    if (!typed.isEmpty() && (!isWritableFileKey(typed) || fileKeyFromTyped(QString::fromLatin1(typed)) != typed))
+    if (!typed.isEmpty() &&
+        (!isWritableFileKey(typed) || fileKeyFromTyped(QString::fromLatin1(typed)) != typed))
         std::abort();
 
     const QString text = QString::fromUtf8(reinterpret_cast<const char*>(data), int(size));

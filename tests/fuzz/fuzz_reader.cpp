@@ -3,8 +3,8 @@
 #include "hotkeysdocument.h"
 #include "hotkeysentries.h"
 #include "hotkeysfile.h"
-#include "keyforms.h"
 #include "hotkeyslines.h"
+#include "keyforms.h"
 
 #include <QMap>
 

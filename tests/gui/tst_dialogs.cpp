@@ -2,10 +2,10 @@
 #include "modalanswerer.h"
 #include "selectcommanddialog.h"
 
-#include <QDialogButtonBox>
-#include <QPushButton>
 #include "testenvironment.h"
 #include "zemmenudialog.h"
+#include <QDialogButtonBox>
+#include <QPushButton>
 
 #include <QToolButton>
 #include <QtTest>
@@ -32,9 +32,12 @@ void TestDialogs::typedCommand_data()
 {
     QTest::addColumn<QString>("typed");
     QTest::addColumn<QString>("command"); // what OK gives; empty: refused, the dialog stays open
-    QTest::newRow("blanks are simplified") << "  xterm   -e top " << "xterm -e top";
-    QTest::newRow("empty") << "   " << "";
-    QTest::newRow("a tab is refused, not folded into a blank") << "xterm\t-e top" << "";
+    QTest::newRow("blanks are simplified") << "  xterm   -e top "
+                                           << "xterm -e top";
+    QTest::newRow("empty") << "   "
+                           << "";
+    QTest::newRow("a tab is refused, not folded into a blank") << "xterm\t-e top"
+                                                               << "";
 }
 
 void TestDialogs::typedCommand()

