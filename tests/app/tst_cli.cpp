@@ -30,6 +30,7 @@ private:
     // Runs zem-hotkeys; gives its exit status and fills what it printed.
     // A launcher (a program and its arguments) runs it, as another account for example.
     int run(const QStringList& arguments, bool display = false, const QStringList& launcher = {});
+    QProcessEnvironment environment(bool display) const;
     void write(const QString& name, const QByteArray& entries);
     QByteArray read(const QString& name) const;
 
@@ -59,16 +60,21 @@ QByteArray TestCli::read(const QString& name) const
     return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
 }
 
-int TestCli::run(const QStringList& arguments, bool display, const QStringList& launcher)
+QProcessEnvironment TestCli::environment(bool display) const
 {
-    QProcess process;
     QProcessEnvironment env = QProcessEnvironment::systemEnvironment();
     env.insert(QStringLiteral("ZEM_USER_DIR"), dir.filePath(QStringLiteral("user")));
     env.insert(QStringLiteral("ZEM_SYSTEM_DIR"), dir.filePath(QStringLiteral("system")));
     env.insert(QStringLiteral("LANG"), QStringLiteral("C.UTF-8"));
     if (!display)
         env.remove(QStringLiteral("DISPLAY"));
-    process.setProcessEnvironment(env);
+    return env;
+}
+
+int TestCli::run(const QStringList& arguments, bool display, const QStringList& launcher)
+{
+    QProcess process;
+    process.setProcessEnvironment(environment(display));
     if (launcher.isEmpty())
         process.start(QStringLiteral(ZEM_CLI_BINARY), arguments);
     else
@@ -203,16 +209,12 @@ void TestCli::concurrentWriters()
     // Several zem-hotkeys set at the same moment on one file, round after round: every change
     // is there afterwards, none lost to a writer that read before another wrote.
     const int writers = 3;
-    QProcessEnvironment env = QProcessEnvironment::systemEnvironment();
-    env.insert(QStringLiteral("ZEM_USER_DIR"), dir.filePath(QStringLiteral("user")));
-    env.insert(QStringLiteral("ZEM_SYSTEM_DIR"), dir.filePath(QStringLiteral("system")));
-    env.remove(QStringLiteral("DISPLAY"));
     for (int round = 0; round < 50; ++round) {
         write(QStringLiteral("user/keyshortcutrc"), "Alt|F5=ZEMWM_LOCK\n");
         std::vector<std::unique_ptr<QProcess>> processes;
         for (int w = 0; w < writers; ++w) {
             processes.push_back(std::make_unique<QProcess>());
-            processes.back()->setProcessEnvironment(env);
+            processes.back()->setProcessEnvironment(environment(false));
             processes.back()->start(QStringLiteral(ZEM_CLI_BINARY),
                                     {QStringLiteral("set"), QStringLiteral("Ctrl+Alt+F%1").arg(w + 1),
                                      QStringLiteral("xclock -%1").arg(w)});

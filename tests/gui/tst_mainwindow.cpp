@@ -71,6 +71,11 @@ private:
     {
         form->findChild<QTreeWidget*>()->setCurrentItem(row(name, index));
     }
+    void assign(const QString& name, const char* key) const
+    {
+        select(name);
+        form->setKey(QKeySequence(QLatin1String(key)));
+    }
     QAction* action(const char* name) const { return form->findChild<QAction*>(QLatin1String(name)); }
     KKeySequenceWidget* keyWidget() const { return form->findChild<KKeySequenceWidget*>("keyWidget"); }
     // Every row with its key and source, then the disabled keys.
@@ -126,21 +131,11 @@ void TestMainWindow::selectionShowsTheRow_data()
     QTest::addColumn<QString>("panel");   // "" disabled, else the checked radio and the key shown
 
     // Each starts from ZEMWM_LOCK selected, which shows Alt+F5.
-    QTest::newRow("function with a key") << "ZEMWM_LOCK"
-                                         << "C"
-                                         << "assign Alt+F5";
-    QTest::newRow("function without key") << "ZEMWM_EXIT"
-                                          << "C"
-                                          << "clear None";
-    QTest::newRow("group row") << "group"
-                               << ""
-                               << "";
-    QTest::newRow("command group row") << "commands"
-                                       << "N"
-                                       << "";
-    QTest::newRow("command row") << "cmd:xclock"
-                                 << "NCED"
-                                 << "assign Ctrl+Alt+X";
+    QTest::newRow("function with a key") << "ZEMWM_LOCK" << QString("C") << "assign Alt+F5";
+    QTest::newRow("function without key") << "ZEMWM_EXIT" << QString("C") << "clear None";
+    QTest::newRow("group row") << "group" << QString() << QString();
+    QTest::newRow("command group row") << "commands" << QString("N") << QString();
+    QTest::newRow("command row") << "cmd:xclock" << QString("NCED") << "assign Ctrl+Alt+X";
 }
 
 void TestMainWindow::selectionShowsTheRow()
@@ -197,8 +192,7 @@ void TestMainWindow::recordedKeyAndConflict()
 void TestMainWindow::saveAndApplyStates()
 {
     QVERIFY(!saveEnabled());
-    select(QStringLiteral("ZEMWM_EXIT"));
-    form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
+    assign(QStringLiteral("ZEMWM_EXIT"), "Ctrl+Alt+E");
     QVERIFY(saveEnabled());
     form->fileSave();
     QVERIFY(!KeysConfForm::isModified() && !saveEnabled());
@@ -230,8 +224,7 @@ void TestMainWindow::failedWriteKeepsEdits_data()
 void TestMainWindow::failedWriteKeepsEdits()
 {
     QFETCH(QString, command);
-    select(QStringLiteral("ZEMWM_EXIT"));
-    form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
+    assign(QStringLiteral("ZEMWM_EXIT"), "Ctrl+Alt+E");
     // The file's directory is replaced by a file: the write fails, and says why.
     QVERIFY(QDir(QFileInfo(userFile).path()).removeRecursively() &&
             writeFile(QFileInfo(userFile).path(), "x"));
@@ -266,8 +259,7 @@ void TestMainWindow::closeQuestion()
     QFETCH(bool, closed);
     QFETCH(bool, saved);
     const QByteArray before = readFile(userFile);
-    select(QStringLiteral("ZEMWM_EXIT"));
-    form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
+    assign(QStringLiteral("ZEMWM_EXIT"), "Ctrl+Alt+E");
 
     ModalAnswerer answerer({answer});
     QCOMPARE(form->close(), closed);
@@ -309,8 +301,7 @@ void TestMainWindow::commandEntries()
 
 void TestMainWindow::saveAsAndRestore()
 {
-    select(QStringLiteral("ZEMWM_EXIT"));
-    form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
+    assign(QStringLiteral("ZEMWM_EXIT"), "Ctrl+Alt+E");
     const QString other = QFileInfo(userFile).path() + QLatin1String("/other.rc");
     ModalAnswerer answerer({QMessageBox::Cancel, QMessageBox::Yes}, {other});
     form->fileSaveAs();
@@ -388,8 +379,7 @@ void TestMainWindow::changedOnDisk()
     QFETCH(QString, lockKey);
     QFETCH(bool, system);
     if (edited) {
-        select(QStringLiteral("ZEMWM_EXIT"));
-        form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+E")));
+        assign(QStringLiteral("ZEMWM_EXIT"), "Ctrl+Alt+E");
     }
     select(QStringLiteral("ZEMWM_LOCK"));
     const QString changed =
@@ -464,18 +454,15 @@ void TestMainWindow::undoRedo_data()
 {
     QTest::addColumn<QString>("edit");
     QTest::addColumn<QString>("undoText");
-    QTest::newRow("assign") << "assign"
-                            << "Undo Assign Ctrl+Alt+E to exit zem-wm";
-    QTest::newRow("clear a system key") << "clear"
-                                        << "Undo Clear the key of close a window (recommend)";
-    QTest::newRow("clone") << "clone"
-                           << "Undo Clone lock screen";
-    QTest::newRow("delete a command") << "delete"
-                                      << "Undo Delete xclock";
+    QTest::newRow("assign") << "assign" << QString("Undo Assign Ctrl+Alt+E to exit zem-wm");
+    QTest::newRow("clear a system key")
+        << "clear" << QString("Undo Clear the key of close a window (recommend)");
+    QTest::newRow("clone") << "clone" << QString("Undo Clone lock screen");
+    QTest::newRow("delete a command") << "delete" << QString("Undo Delete xclock");
     QTest::newRow("reassign") << "reassign"
-                              << "Undo Reassign Ctrl+K from close a window forcely to exit zem-wm";
+                              << QString("Undo Reassign Ctrl+K from close a window forcely to exit zem-wm");
     QTest::newRow("revert") << "revert"
-                            << "Undo Revert close a window (recommend) to the system binding";
+                            << QString("Undo Revert close a window (recommend) to the system binding");
 }
 
 void TestMainWindow::undoRedo()
@@ -484,8 +471,7 @@ void TestMainWindow::undoRedo()
     QFETCH(QString, undoText);
     ModalAnswerer answerer({edit == QLatin1String("delete") ? QMessageBox::Yes : QMessageBox::Apply});
     if (edit == QLatin1String("revert")) {
-        select(QStringLiteral("ZEMWM_CLOSE"));
-        form->setKey(QKeySequence(QStringLiteral("Alt+F9")));
+        assign(QStringLiteral("ZEMWM_CLOSE"), "Alt+F9");
         QVERIFY(action("revertAction")->isEnabled());
     }
     const QStringList before = state();
