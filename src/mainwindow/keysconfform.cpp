@@ -48,7 +48,8 @@ QAction* makeAction(QObject* parent, const QString& text, const char* iconName)
 
 } // namespace
 
-KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags) : QMainWindow(parent, flags)
+KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
+    : QMainWindow(parent, flags), edited(new EditedFile(this)), model(edited->model())
 {
     setWindowTitle(tr("Zem hotkeys editor"));
     userSource = tr("user");
@@ -212,15 +213,7 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags) : QMainWindow
     connect(cloneCommandAction, &QAction::triggered, this, &KeysConfForm::cloneCommand);
     connect(revertAction, &QAction::triggered, this, &KeysConfForm::revertToSystemBinding);
     connect(undoStack, &QUndoStack::indexChanged, this, &KeysConfForm::fileChanged);
-
-    // Changes on disk come in bursts (a write, a rename); they are gathered for a moment.
-    watcher = new QFileSystemWatcher(this);
-    changeTimer = new QTimer(this);
-    changeTimer->setSingleShot(true);
-    changeTimer->setInterval(300);
-    connect(watcher, &QFileSystemWatcher::fileChanged, changeTimer, qOverload<>(&QTimer::start));
-    connect(watcher, &QFileSystemWatcher::directoryChanged, changeTimer, qOverload<>(&QTimer::start));
-    connect(changeTimer, &QTimer::timeout, this, &KeysConfForm::filesChangedOnDisk);
+    connect(edited, &EditedFile::changedOnDisk, this, &KeysConfForm::filesChangedOnDisk);
 }
 
 KeysConfForm::~KeysConfForm()

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "editedfile.h"
 #include "hotkeysmodel.h"
 
 #include <QMainWindow>
@@ -11,7 +12,6 @@
 class BindingTree;
 class KKeySequenceWidget;
 class QAction;
-class QFileSystemWatcher;
 class QTimer;
 class QGroupBox;
 class QLabel;
@@ -135,19 +135,11 @@ private:
     // The row the command operations act on: the first selected row, else the current one.
     QTreeWidgetItem* targetRow() const;
     BindingId bindingAt(const QTreeWidgetItem* row) const;
-    // Remembers what the edited file (which holds fileBytes) and the system file it is merged
-    // with now hold, and watches them for changes by other programs.
-    void watchFiles(const QByteArray& fileBytes);
-    void rewatch();
-    enum class DiskChange { None, EditedFile, SystemFile, Vanished };
-    DiskChange changedOnDisk() const;
-    // What both files hold now, in short, to tell whether they changed again.
-    QByteArray diskDigests() const;
-    void filesChangedOnDisk();
+    void filesChangedOnDisk(EditedFile::Change change);
     void reloadKeepingSelection();
     // Before a save: false when the file changed on disk and the user chose not to overwrite it
     // (Reload loads it as it is now).
-    bool mayOverwrite(DiskChange change);
+    bool mayOverwrite(EditedFile::Change change);
     // Copies a file's bytes through the same safe write as saving; says so when it fails.
     bool copyFile(const QString& from, const QString& to);
     // Keeps the file as it is beside it, with "~" added to its name; says so when it cannot.
@@ -173,11 +165,14 @@ private:
     QAction* deleteCommandAction = nullptr;
     QAction* cloneCommandAction = nullptr;
     QVBoxLayout* mainLayout = nullptr;
-    HotkeysModel model;
+    // The edited file and its bindings have one owner; model is the bindings it holds.
+    EditedFile* edited;
+    HotkeysModel& model;
     std::unique_ptr<BindingTree> bindingTree;
-    QString failedPath;
-    QString loadError;
     QString saveError;
+    EditedFile::SaveResult lastSave = EditedFile::SaveResult::Saved;
+    // What was on disk when the user agreed to overwrite it.
+    QByteArray acceptedDiskState;
     QUndoStack* undoStack = nullptr;
     QAction* revertAction = nullptr;
     bool reassignChosen = false;
@@ -187,12 +182,6 @@ private:
     QTimer* filterTimer = nullptr;
     QList<bool> expandedBeforeFilter;
     bool wasFiltering = false;
-    QFileSystemWatcher* watcher = nullptr;
-    QTimer* changeTimer = nullptr;
-    QString watchedFile;
-    QByteArray watchedDigest;
-    QString watchedSystem;
-    QByteArray systemDigest;
 
     static QString userSource;
     static QString systemSource;

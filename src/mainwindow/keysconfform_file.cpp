@@ -17,7 +17,6 @@
 #include <QX11Info>
 
 #include <cstdio>
-#include <sys/stat.h>
 
 void KeysConfForm::updateTitle()
 {
@@ -89,50 +88,24 @@ bool KeysConfForm::selectFile(bool forOpen)
 
 bool KeysConfForm::copyFile(const QString& from, const QString& to)
 {
-    // Copying a file onto itself would change nothing.
-    const QString source = QFileInfo(from).canonicalFilePath();
-    if (!source.isEmpty() && source == QFileInfo(to).canonicalFilePath())
-        return true;
     // The copy goes through the same all-or-nothing write as saving: a full disk leaves the
     // file it was to replace as it was; and it waits for any other writer of the target.
-    QFile file(from);
-    QString reason;
-    QByteArray bytes;
-    DirectoryLock lock;
-    if (!file.open(QIODevice::ReadOnly)) {
-        reason = file.errorString();
-    } else {
-        bytes = file.read(largestHotkeysFile + 1);
-        if (file.error() != QFileDevice::NoError)
-            reason = file.errorString();
-        else if (bytes.size() > largestHotkeysFile)
-            reason = tr("The file is larger than 16 MiB");
-    }
-    if (reason.isEmpty() && lock.lock(to, &reason) && writeFileSafely(to, bytes, &reason))
+    if (edited->copy(from, to))
         return true;
     QMessageBox::warning(this, tr("Error"),
-                         tr("Can't copy %1\nto %2").arg(from, to) + QLatin1Char('\n') + reason,
+                         tr("Can't copy %1\nto %2").arg(from, to) + QLatin1Char('\n') + edited->error(),
                          QMessageBox::Ok);
     return false;
 }
 
 bool KeysConfForm::keepBackup(const QString& path)
 {
-    // The replaced file stays beside it, so that even a confirmed Restore can be taken back. The
-    // backup is a new file renamed into place: whatever stands under its name, a link another
-    // account planted included, is replaced and never written through, and it is as private
-    // as the file it keeps.
-    QString reason;
-    QByteArray bytes;
-    struct stat info;
-    if (!QFileInfo::exists(path))
-        return true;
-    if (readHotkeysFile(path, &bytes, &reason) && ::stat(QFile::encodeName(path).constData(), &info) == 0 &&
-        writeNewFile(path + QLatin1Char('~'), bytes, info.st_mode, &reason))
+    // The replaced file stays beside it, so that even a confirmed Restore can be taken back.
+    if (edited->keepBackup(path))
         return true;
     QMessageBox::warning(this, tr("Error"),
                          tr("Can't copy %1\nto %2").arg(path, path + QLatin1Char('~')) + QLatin1Char('\n') +
-                             reason,
+                             edited->error(),
                          QMessageBox::Ok);
     return false;
 }
@@ -146,15 +119,14 @@ bool KeysConfForm::loadFile(const QString& path)
 {
     if (path.isEmpty())
         return false;
-    const QString systemPath = path == userHotkeysFilePath() ? systemHotkeysFilePath() : QString();
-    if (!model.load(path, systemPath, &failedPath, &loadError)) {
+    if (!edited->load(path)) {
         std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n",
-                     printableText(failedPath).toLocal8Bit().constData(),
-                     loadError.toLocal8Bit().constData());
+                     printableText(edited->failedPath()).toLocal8Bit().constData(),
+                     edited->error().toLocal8Bit().constData());
         return false;
     }
     std::fprintf(stderr, "files %s %s\n", path.toLocal8Bit().constData(),
-                 systemPath.toLocal8Bit().constData());
+                 edited->systemPath().toLocal8Bit().constData());
 
     currentFile = path;
     updateTitle();
@@ -168,35 +140,36 @@ bool KeysConfForm::loadFile(const QString& path)
     // A loaded file has nothing to undo and no unsaved edits.
     undoStack->clear();
     fileChanged();
-    watchFiles(model.readBytes());
     return true;
 }
 
 QString KeysConfForm::loadFailure() const
 {
-    return loadError.isEmpty() ? failedPath : failedPath + QLatin1Char('\n') + loadError;
+    const QString why = edited->error();
+    return why.isEmpty() ? edited->failedPath() : edited->failedPath() + QLatin1Char('\n') + why;
 }
 
 bool KeysConfForm::saveFile()
 {
+    lastSave = EditedFile::SaveResult::Saved;
     if (!modified)
         return true;
     if (currentFile.isEmpty()) {
         saveError = tr("No file name");
+        lastSave = EditedFile::SaveResult::Failed;
         return false;
     }
-    QByteArray bytes;
-    const bool composed = model.toBytes(currentFile == userHotkeysFilePath(), &bytes, &saveError);
+    // The bindings go to the file the commands chose last.
+    if (edited->path() != currentFile)
+        edited->setPath(currentFile);
+    lastSave = edited->save(acceptedDiskState);
     // Keyless commands have been given their placeholder keys.
     bindingTree->refreshCommands();
-    if (!composed || !writeFileSafely(currentFile, bytes, &saveError)) {
+    saveError = edited->error();
+    if (lastSave == EditedFile::SaveResult::Failed)
         std::fprintf(stderr, "zem-admin-hotkeys: Can't save file %s\n",
                      printableText(currentFile).toLocal8Bit().constData());
-        return false;
-    }
-    saveError.clear();
-    watchFiles(bytes);
-    return true;
+    return lastSave == EditedFile::SaveResult::Saved;
 }
 
 void KeysConfForm::fileNew()
@@ -237,21 +210,19 @@ bool KeysConfForm::saveFileOrWarn()
 {
     // Another program may write the file at any moment: whether it did is asked under the lock
     // that every writer of this program takes, and the lock is held until the file is replaced.
-    // It is let go while the user is asked, so that the others are not kept waiting.
-    DirectoryLock lock;
-    QByteArray accepted;
-    while (modified) {
-        if (!lock.lock(currentFile, &saveError))
+    // The user is asked with the lock let go, so that the others are not kept waiting.
+    acceptedDiskState.clear();
+    if (modified && currentFile == edited->path() && edited->change() == EditedFile::Change::Vanished)
+        mayOverwrite(EditedFile::Change::Vanished);
+    while (!saveFile()) {
+        if (lastSave != EditedFile::SaveResult::Changed)
             break;
-        const DiskChange change = changedOnDisk();
-        if (change == DiskChange::None || diskDigests() == accepted)
-            break;
-        accepted = diskDigests();
-        lock.unlock();
-        if (!mayOverwrite(change))
+        const QByteArray seen = edited->diskState();
+        if (!mayOverwrite(edited->change()))
             return false;
+        acceptedDiskState = seen;
     }
-    if ((!modified || lock.isLocked()) && saveFile())
+    if (lastSave == EditedFile::SaveResult::Saved)
         return true;
     // The system's reason goes on a line of its own.
     QMessageBox::warning(this, tr("Error"),
