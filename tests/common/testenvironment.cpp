@@ -14,18 +14,3 @@ TestEnvironment::TestEnvironment() : dir(QDir::tempPath() + QLatin1String("/zem-
     }
     qunsetenv("ZEM_SESSION_SUFFIX");
 }
-
-bool writeFile(const QString& path, const QByteArray& bytes)
-{
-    QDir().mkpath(QFileInfo(path).absolutePath());
-    QFile file(path);
-    if (!file.open(QIODevice::WriteOnly | QIODevice::Truncate))
-        return false;
-    return file.write(bytes) == bytes.size();
-}
-
-QByteArray readFile(const QString& path)
-{
-    QFile file(path);
-    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
-}

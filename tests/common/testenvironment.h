@@ -1,5 +1,7 @@
 #pragma once
 
+#include "testfiles.h"
+
 #include <QApplication>
 #include <QString>
 #include <QTemporaryDir>
@@ -15,10 +17,6 @@ public:
 private:
     QTemporaryDir dir;
 };
-
-// Writes a file with exactly these bytes (creating its directory); fails the test otherwise.
-bool writeFile(const QString& path, const QByteArray& bytes);
-QByteArray readFile(const QString& path);
 
 #define ZEM_TEST_MAIN(TestObject)                                                                            \
     int main(int argc, char** argv)                                                                          \

@@ -5,6 +5,7 @@
 #include "hotkeysfile.h"
 #include "keyforms.h"
 #include "safefile.h"
+#include "testfiles.h"
 #include "zemcore.h"
 
 #include <QProcess>
@@ -17,22 +18,6 @@
 #include <sys/wait.h>
 #include <sys/xattr.h>
 #include <unistd.h>
-
-namespace {
-
-QByteArray readAll(const QString& path)
-{
-    QFile file(path);
-    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
-}
-
-bool writeRaw(const QString& path, const QByteArray& bytes)
-{
-    QFile file(path);
-    return file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size();
-}
-
-} // namespace
 
 class TestHotkeysFile : public QObject
 {
@@ -261,9 +246,9 @@ void TestHotkeysFile::refused()
     if (reason.startsWith(QLatin1String("Not a")))
         QVERIFY(QDir().mkpath(path));
     else if (reason.contains(QLatin1String("16 MiB")))
-        QVERIFY(writeRaw(path, "[ShortCutKeys]\n") && QFile::resize(path, largestHotkeysFile + 1));
+        QVERIFY(writeFile(path, "[ShortCutKeys]\n") && QFile::resize(path, largestHotkeysFile + 1));
     else if (!bytes.isEmpty())
-        QVERIFY(writeRaw(path, bytes));
+        QVERIFY(writeFile(path, bytes));
 
     QByteArray read;
     QString why;
@@ -281,7 +266,7 @@ void TestHotkeysFile::failedWriteKeepsFile()
     QVERIFY(QDir().mkpath(base));
     // 64 KiB of room, the old file in it; where no tmpfs can be mounted, a file size limit.
     const bool mounted = ::mount("tmpfs", QFile::encodeName(base).constData(), "tmpfs", 0, "size=64k") == 0;
-    QVERIFY(writeRaw(path, old));
+    QVERIFY(writeFile(path, old));
 
     // In a child, so that a file size limit touches nothing else.
     const pid_t child = ::fork();
@@ -297,7 +282,7 @@ void TestHotkeysFile::failedWriteKeepsFile()
     }
     int status = 0;
     QCOMPARE(::waitpid(child, &status, 0), child);
-    const QByteArray after = readAll(path);
+    const QByteArray after = readFile(path);
     // No half-written file is left beside it.
     const QStringList files = QDir(base).entryList(QDir::Files | QDir::Hidden);
     if (mounted)
@@ -311,7 +296,7 @@ void TestHotkeysFile::writeKeepsModeAndLink()
 {
     const QString target = dir.filePath(QStringLiteral("target"));
     const QString link = dir.filePath(QStringLiteral("link"));
-    QVERIFY(writeRaw(target, "old"));
+    QVERIFY(writeFile(target, "old"));
     QVERIFY(QFile::setPermissions(target, QFile::ReadOwner | QFile::WriteOwner));
     QVERIFY(QFile::link(target, link));
 
@@ -325,7 +310,7 @@ void TestHotkeysFile::writeKeepsModeAndLink()
     QString reason;
     QVERIFY2(writeFileSafely(link, "new", &reason), qPrintable(reason));
     QVERIFY(QFileInfo(link).isSymLink());
-    QCOMPARE(readAll(target), QByteArray("new"));
+    QCOMPARE(readFile(target), QByteArray("new"));
     QCOMPARE(QFile::permissions(target), mode);
     QProcess acl;
     acl.start(QStringLiteral("getfacl"), {QStringLiteral("-cn"), target});
@@ -358,7 +343,7 @@ void TestHotkeysFile::refusedWrites()
     QVERIFY(QDir().mkpath(base));
     QString path = base + QLatin1String("/keyshortcutrc");
     const QByteArray old = "[ShortCutKeys]\n";
-    QVERIFY(writeRaw(path, old));
+    QVERIFY(writeFile(path, old));
     QByteArray bytes = "[ShortCutKeys]\nAlt|F4=ZEMWM_CLOSE\n";
     if (why == QLatin1String("read-only")) {
         QVERIFY(QFile::setPermissions(path, QFile::ReadOwner | QFile::ReadGroup | QFile::ReadOther));
@@ -377,7 +362,7 @@ void TestHotkeysFile::refusedWrites()
     QString said;
     QVERIFY(!writeFileSafely(path, bytes, &said));
     QVERIFY2(said.contains(reason), qPrintable(said));
-    QCOMPARE(readAll(base + QLatin1String("/keyshortcutrc")), old);
+    QCOMPARE(readFile(base + QLatin1String("/keyshortcutrc")), old);
     QCOMPARE(QDir(base).entryList(QDir::Files | QDir::Hidden | QDir::System).size(),
              why == QLatin1String("linked") || why == QLatin1String("planted") ? 2 : 1);
 }
