@@ -68,6 +68,13 @@ bool EditedFile::load(const QString& path)
     return true;
 }
 
+void EditedFile::setBindings(const HotkeysModel& state, BindingId focus)
+{
+    const HotkeysModel before = bindings;
+    bindings = state;
+    emit bindingsChanged(before, focus);
+}
+
 void EditedFile::setPath(const QString& path)
 {
     filePath = path;

@@ -30,6 +30,9 @@ public:
     QString systemPath() const;
     HotkeysModel& model() { return bindings; }
     const HotkeysModel& model() const { return bindings; }
+    // The bindings become this state, as an edit or its undoing makes them; told with the state
+    // before, and the binding the change is about.
+    void setBindings(const HotkeysModel& state, BindingId focus);
 
     // Reads the file, and the system file for the user's own; on failure nothing changes, and
     // failedPath() and error() say which file failed and why.
@@ -53,6 +56,7 @@ public:
     QString error() const { return lastError; }
 
 signals:
+    void bindingsChanged(const HotkeysModel& before, BindingId focus);
     // Another program changed the edited file or the system file; told once they are quiet.
     void changedOnDisk(EditedFile::Change change);
 

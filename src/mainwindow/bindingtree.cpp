@@ -5,7 +5,10 @@
 
 #include <QCoreApplication>
 #include <QKeySequence>
+#include <QSet>
 #include <QTreeWidget>
+
+#include <algorithm>
 
 BindingTree::BindingTree(QTreeWidget* tree, const HotkeysModel* model) : tree(tree), model(model) {}
 
@@ -76,8 +79,9 @@ void BindingTree::show(QTreeWidgetItem* row, const Binding& binding)
         row->setText(2, HotkeysModel::functionNames().at(binding.function));
     }
     showKey(row, binding.key);
-    if (binding.source != BindingSource::Unset)
-        row->setText(3, binding.source == BindingSource::System ? systemText : userText);
+    row->setText(3, binding.source == BindingSource::Unset    ? QString()
+                    : binding.source == BindingSource::System ? systemText
+                                                              : userText);
 }
 
 void BindingTree::showKey(QTreeWidgetItem* row, const QString& key)
@@ -109,23 +113,34 @@ QTreeWidgetItem* BindingTree::insert(BindingId id)
     const Binding* binding = model->find(id);
     if (!binding || rows.contains(id))
         return rowOf(id);
-    const QVector<Binding>& siblings =
-        binding->isCommand() ? model->commands() : model->rowsOf(binding->function);
     QTreeWidgetItem* parent =
         binding->isCommand() ? commandGroupRow : groupOfFunction.value(binding->function);
     if (!parent)
         return nullptr;
-    int place = 0;
-    for (int i = 0; i < siblings.size(); ++i) {
-        if (siblings.at(i).id == id) {
-            QTreeWidgetItem* before = i > 0 ? rowOf(siblings.at(i - 1).id) : nullptr;
-            place = before ? parent->indexOfChild(before) + 1 : 0;
-            break;
+    QTreeWidgetItem* row = makeRow(*binding);
+    parent->insertChild(placeOf(*binding, parent), row);
+    return row;
+}
+
+int BindingTree::placeOf(const Binding& binding, QTreeWidgetItem* parent) const
+{
+    const QVector<Binding>& siblings =
+        binding.isCommand() ? model->commands() : model->rowsOf(binding.function);
+    const auto at = std::find_if(siblings.cbegin(), siblings.cend(),
+                                 [&](const Binding& b) { return b.id == binding.id; });
+    for (auto it = at; it != siblings.cbegin();) {
+        if (QTreeWidgetItem* before = rowOf((--it)->id))
+            return parent->indexOfChild(before) + 1;
+    }
+    for (int function = binding.function - 1; function >= 0 && groupOfFunction.value(function) == parent;
+         --function) {
+        const QVector<Binding>& earlier = model->rowsOf(function);
+        for (auto it = earlier.crbegin(); it != earlier.crend(); ++it) {
+            if (QTreeWidgetItem* before = rowOf(it->id))
+                return parent->indexOfChild(before) + 1;
         }
     }
-    QTreeWidgetItem* row = makeRow(*binding);
-    parent->insertChild(place, row);
-    return row;
+    return 0;
 }
 
 void BindingTree::remove(BindingId id)
@@ -134,6 +149,29 @@ void BindingTree::remove(BindingId id)
     QTreeWidgetItem* row = rows.take(id);
     ids.remove(row);
     delete row;
+}
+
+void BindingTree::follow(const HotkeysModel& before)
+{
+    QHash<BindingId, const Binding*> previous;
+    for (const Binding* old : before.rows())
+        previous.insert(old->id, old);
+    const QVector<const Binding*> now = model->rows();
+    QSet<BindingId> present;
+    for (const Binding* binding : now)
+        present.insert(binding->id);
+    for (auto it = previous.cbegin(); it != previous.cend(); ++it) {
+        if (!present.contains(it.key()))
+            remove(it.key());
+    }
+    for (const Binding* binding : now) {
+        const Binding* was = previous.value(binding->id);
+        if (!rowOf(binding->id))
+            insert(binding->id);
+        else if (!was || was->key != binding->key || was->source != binding->source ||
+                 was->command != binding->command)
+            refresh(binding->id);
+    }
 }
 
 const QVector<BindingTree::SearchRow>& BindingTree::searchRows()

@@ -37,6 +37,9 @@ public:
     QTreeWidgetItem* insert(BindingId id);
     // Deletes the row of a binding the model has just lost.
     void remove(BindingId id);
+    // Makes the rows what the model now holds, touching only the rows that differ from the
+    // state before.
+    void follow(const HotkeysModel& before);
 
     // Every binding row with what a filter looks at, made anew after the tree changed.
     struct SearchRow
@@ -49,6 +52,9 @@ public:
 
 private:
     QTreeWidgetItem* makeRow(const Binding& binding);
+    // Where a new row of the binding goes under its parent: after the row of the binding before
+    // it, or of the last binding of an earlier function of the same group.
+    int placeOf(const Binding& binding, QTreeWidgetItem* parent) const;
     void show(QTreeWidgetItem* row, const Binding& binding);
 
     QTreeWidget* tree;

@@ -214,6 +214,7 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     connect(revertAction, &QAction::triggered, this, &KeysConfForm::revertToSystemBinding);
     connect(undoStack, &QUndoStack::indexChanged, this, &KeysConfForm::fileChanged);
     connect(edited, &EditedFile::changedOnDisk, this, &KeysConfForm::filesChangedOnDisk);
+    connect(edited, &EditedFile::bindingsChanged, this, &KeysConfForm::followBindings);
 }
 
 KeysConfForm::~KeysConfForm()
@@ -325,31 +326,24 @@ void KeysConfForm::updateRevertAction()
                              model.differsFromSystem(binding->function));
 }
 
-void KeysConfForm::recordEdit(const QString& text, const HotkeysModel& before, BindingId focus)
+void KeysConfForm::edit(const QString& text, BindingId focus, const HotkeysModel& after)
 {
-    undoStack->push(new ModelCommand(this, text, before, model, focus));
-    fileChanged();
+    undoStack->push(new ModelCommand(edited, text, model, after, focus));
 }
 
-void KeysConfForm::showBindings(const HotkeysModel& state, BindingId focus)
+void KeysConfForm::followBindings(const HotkeysModel& before, BindingId focus)
 {
-    model = state;
-    QList<bool> expanded;
-    for (int g = 0; g < keysTree->topLevelItemCount(); ++g)
-        expanded << keysTree->topLevelItem(g)->isExpanded();
-    keysTree->setUpdatesEnabled(false);
-    fillFunctionTree();
-    for (int g = 0; g < keysTree->topLevelItemCount(); ++g)
-        keysTree->topLevelItem(g)->setExpanded(expanded.value(g));
-    keysTree->setUpdatesEnabled(true);
-    applyFilter();
-    // The row the step was about, where it still is.
+    bindingTree->follow(before);
+    // The row the step is about, where it still is, shown even where the filter hid it.
     if (QTreeWidgetItem* row = bindingTree->rowOf(focus)) {
         row->setHidden(false);
         row->parent()->setHidden(false);
         keysTree->scrollToItem(row);
         keysTree->setCurrentItem(row);
     }
+    // The key panel shows the selected row as it is now, also when the step left it selected.
+    itemSelected(keysTree->currentItem());
+    updateRevertAction();
 }
 
 QTreeWidgetItem* KeysConfForm::setActionsEnabled(QTreeWidgetItem* item)

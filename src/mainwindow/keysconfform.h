@@ -100,8 +100,6 @@ public slots:
     void revertToSystemBinding();
 
     bool messageReceived(const QString& message);
-    // Shows these bindings, as undo and redo do, with the row they were about made current.
-    void showBindings(const HotkeysModel& state, BindingId focus);
     // Shows the rows the filter text matches; a row that stops matching through an edit stays
     // until the text changes or a file is loaded.
     void applyFilter();
@@ -116,8 +114,10 @@ protected:
 
 private:
     void showHeaderMenu(const QPoint& position);
-    // An edit already done on the model becomes one step of the undo stack.
-    void recordEdit(const QString& text, const HotkeysModel& before, BindingId focus);
+    // The one way to make an edit: the bindings become `after` as one step of the undo stack,
+    // and the tree follows, with the row the edit is about made current.
+    void edit(const QString& text, BindingId focus, const HotkeysModel& after);
+    void followBindings(const HotkeysModel& before, BindingId focus);
     // After New, Open and Restore: nothing to undo, and the file counts as edited.
     void startAfresh();
     void updateRevertAction();

@@ -16,15 +16,9 @@ void KeysConfForm::newCommand()
     if (dialog.exec() != QDialog::Accepted || dialog.command().isEmpty())
         return;
 
-    const HotkeysModel before = model;
-    const BindingId id = model.addCommand(dialog.command());
-    QTreeWidgetItem* row = bindingTree->insert(id);
-    // Shown even where a filter hid every other command.
-    commandGroupItem->setHidden(false);
-    keysTree->scrollToItem(row);
-    keysTree->setCurrentItem(row);
-    keyGroupBox->setEnabled(true);
-    recordEdit(tr("Add command %1").arg(dialog.command()), before, id);
+    HotkeysModel after = model;
+    const BindingId id = after.addCommand(dialog.command());
+    edit(tr("Add command %1").arg(dialog.command()), id, after);
 }
 
 void KeysConfForm::editCommand()
@@ -44,10 +38,9 @@ void KeysConfForm::itemDoubleClicked(QTreeWidgetItem* clicked, int)
     if (dialog.exec() != QDialog::Accepted || dialog.command().isEmpty() ||
         dialog.command() == clicked->text(0))
         return;
-    const HotkeysModel before = model;
-    model.setCommand(bindingAt(clicked), dialog.command());
-    bindingTree->refresh(bindingAt(clicked));
-    recordEdit(tr("Edit command %1").arg(dialog.command()), before, bindingAt(clicked));
+    HotkeysModel after = model;
+    after.setCommand(bindingAt(clicked), dialog.command());
+    edit(tr("Edit command %1").arg(dialog.command()), bindingAt(clicked), after);
 }
 
 void KeysConfForm::cloneCommand()
@@ -55,15 +48,10 @@ void KeysConfForm::cloneCommand()
     QTreeWidgetItem* target = targetRow();
     if (!target || !target->parent())
         return;
-    const HotkeysModel before = model;
-    const BindingId id = model.cloneRow(bindingAt(target));
-    QTreeWidgetItem* row = bindingTree->insert(id);
-    if (!row)
-        return;
-    keysTree->scrollToItem(row);
-    keysTree->setCurrentItem(row);
-    keyGroupBox->setEnabled(true);
-    recordEdit(tr("Clone %1").arg(target->text(0)), before, id);
+    HotkeysModel after = model;
+    const BindingId id = after.cloneRow(bindingAt(target));
+    if (id)
+        edit(tr("Clone %1").arg(target->text(0)), id, after);
 }
 
 void KeysConfForm::deleteCommand()
@@ -76,15 +64,13 @@ void KeysConfForm::deleteCommand()
                               QMessageBox::Yes | QMessageBox::No, QMessageBox::No) != QMessageBox::Yes)
         return;
 
-    const HotkeysModel before = model;
+    HotkeysModel after = model;
     const BindingId id = bindingAt(target);
-    const QString text = target->text(0);
-    if (!model.removeRow(id))
+    if (!after.removeRow(id))
         return;
-    bindingTree->remove(id);
+    edit(tr("Delete %1").arg(target->text(0)), id, after);
     keysTree->setCurrentItem(parent);
     parent->setSelected(true);
-    recordEdit(tr("Delete %1").arg(text), before, id);
 }
 
 void KeysConfForm::revertToSystemBinding()
@@ -93,12 +79,10 @@ void KeysConfForm::revertToSystemBinding()
     const Binding* binding = model.find(id);
     if (!binding || binding->isCommand() || currentFile != userHotkeysFilePath())
         return;
-    const HotkeysModel before = model;
+    HotkeysModel after = model;
     const QString text = targetRow()->text(0);
-    const QStringList heldElsewhere = model.revertToSystem(binding->function);
-    const BindingId first = model.rowsOf(before.find(id)->function).first().id;
-    showBindings(model, first);
-    recordEdit(tr("Revert %1 to the system binding").arg(text), before, first);
+    const QStringList heldElsewhere = after.revertToSystem(binding->function);
+    edit(tr("Revert %1 to the system binding").arg(text), after.rowsOf(binding->function).first().id, after);
     if (!heldElsewhere.isEmpty()) {
         QStringList shown;
         for (const QString& key : heldElsewhere)

@@ -73,31 +73,24 @@ void KeysConfForm::setKey(const QKeySequence& seq)
     const BindingId id = bindingAt(keysTree->currentItem());
     if (!id || seq.isEmpty())
         return;
-    const HotkeysModel before = model;
+    HotkeysModel after = model;
     const QString key = seq.toString(QKeySequence::PortableText);
+    const QString shown = seq.toString(QKeySequence::NativeText);
     if (isKeyPresent(seq, true)) {
         if (!reassignChosen)
             return;
         // The key moves here; the row that held it is left without one.
         const BindingId holder = model.holderOf(key, id);
         const QString holderText = bindingTree->rowOf(holder)->text(0);
-        model.reassign(holder, id);
-        bindingTree->refresh(holder);
-        bindingTree->refresh(id);
+        after.reassign(holder, id);
         showInKeyWidget(seq);
-        recordEdit(
-            tr("Reassign %1 from %2 to %3")
-                .arg(seq.toString(QKeySequence::NativeText), holderText, keysTree->currentItem()->text(0)),
-            before, id);
+        edit(tr("Reassign %1 from %2 to %3").arg(shown, holderText, keysTree->currentItem()->text(0)), id,
+             after);
         return;
     }
-
-    model.setKey(id, key);
-    bindingTree->refresh(id);
+    after.setKey(id, key);
     showInKeyWidget(seq);
-    recordEdit(
-        tr("Assign %1 to %2").arg(seq.toString(QKeySequence::NativeText), keysTree->currentItem()->text(0)),
-        before, id);
+    edit(tr("Assign %1 to %2").arg(shown, keysTree->currentItem()->text(0)), id, after);
 }
 
 bool KeysConfForm::isKeyPresent(const QKeySequence& seq, bool warnuser)
@@ -136,10 +129,9 @@ void KeysConfForm::opt_nokeys_checked()
     const BindingId id = bindingAt(keysTree->currentItem());
     if (!id)
         return;
-    const HotkeysModel before = model;
-    model.clearKey(id);
-    bindingTree->refresh(id);
-    recordEdit(tr("Clear the key of %1").arg(keysTree->currentItem()->text(0)), before, id);
+    HotkeysModel after = model;
+    after.clearKey(id);
+    edit(tr("Clear the key of %1").arg(keysTree->currentItem()->text(0)), id, after);
     keyWidget->clearKeySequence();
     keyWidget->setEnabled(false);
 }

@@ -13,7 +13,6 @@
 
 namespace {
 
-
 // A row as it can be found again in a rebuilt tree: its function or command line, and which of
 // the rows of that name it is.
 QString identityOf(const QTreeWidgetItem* row)

@@ -1,23 +1,19 @@
 #include "modelcommand.h"
 
-#include "keysconfform.h"
+#include "editedfile.h"
 
-ModelCommand::ModelCommand(KeysConfForm* form, const QString& text, const HotkeysModel& before,
+ModelCommand::ModelCommand(EditedFile* file, const QString& text, const HotkeysModel& before,
                            const HotkeysModel& after, BindingId focus)
-    : QUndoCommand(text), form(form), before(before), after(after), focus(focus)
+    : QUndoCommand(text), file(file), before(before), after(after), focus(focus)
 {
 }
 
 void ModelCommand::undo()
 {
-    form->showBindings(before, focus);
+    file->setBindings(before, focus);
 }
 
 void ModelCommand::redo()
 {
-    if (done) {
-        done = false;
-        return;
-    }
-    form->showBindings(after, focus);
+    file->setBindings(after, focus);
 }

@@ -4,24 +4,22 @@
 
 #include <QUndoCommand>
 
-class KeysConfForm;
+class EditedFile;
 
-// One edit as an undoable step: the bindings before and after it, and the row it was about.
-// The edit itself is done by the window before the step is pushed, so the first redo does
-// nothing; later ones, and undo, show the whole state of the other side.
+// One edit as an undoable step: the bindings before and after it, and the row it is about. It
+// acts on the edited file's bindings alone; whoever shows them follows the file's signal.
 class ModelCommand : public QUndoCommand
 {
 public:
-    ModelCommand(KeysConfForm* form, const QString& text, const HotkeysModel& before,
-                 const HotkeysModel& after, BindingId focus);
+    ModelCommand(EditedFile* file, const QString& text, const HotkeysModel& before, const HotkeysModel& after,
+                 BindingId focus);
 
     void undo() override;
     void redo() override;
 
 private:
-    KeysConfForm* form;
+    EditedFile* file;
     HotkeysModel before;
     HotkeysModel after;
     BindingId focus;
-    bool done = true;
 };
