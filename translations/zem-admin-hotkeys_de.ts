@@ -2,6 +2,13 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="de_DE">
 <context>
+    <name>EditedFile</name>
+    <message>
+        <source>No file name</source>
+        <translation>Kein Dateiname</translation>
+    </message>
+</context>
+<context>
     <name>Handbook</name>
     <message>
         <source>Zem hotkeys editor Handbook</source>
@@ -13,7 +20,7 @@
     </message>
     <message>
         <source>&lt;h3&gt;Keys&lt;/h3&gt;&lt;p&gt;Select a row and click &lt;b&gt;Assign Key:&lt;/b&gt;, then press the combination. A combination that another row holds is refused; &lt;b&gt;Reassign&lt;/b&gt; in that message moves it to your row and leaves the other without a key. &lt;b&gt;Clear Key&lt;/b&gt; takes the key away. A system key you clear or change is written into your file as &lt;i&gt;Disable&lt;/i&gt;, which switches the system binding of that key off. &lt;b&gt;Revert to System Binding&lt;/b&gt; in the Edit menu gives a function back the keys the system file gives it. Every edit can be undone and redone (Ctrl+Z, Ctrl+Shift+Z).&lt;/p&gt;</source>
-        <translation>&lt;h3&gt;Kürzel&lt;/h3&gt;&lt;p&gt;Wählen Sie eine Zeile, klicken Sie auf &lt;b&gt;Kürzel zuweisen:&lt;/b&gt; und drücken Sie die Kombination. Eine Kombination, die eine andere Zeile hat, wird abgelehnt; &lt;b&gt;Übergeben&lt;/b&gt; in dieser Meldung gibt sie Ihrer Zeile und lässt die andere ohne Kürzel. &lt;b&gt;Kürzel entfernen&lt;/b&gt; nimmt das Kürzel weg. Ein Systemkürzel, das Sie entfernen oder ändern, wird als &lt;i&gt;Disable&lt;/i&gt; in Ihre Datei geschrieben, was die Systembelegung dieses Kürzels abschaltet. &lt;b&gt;Systemkürzel wiederherstellen&lt;/b&gt; im Menü Bearbeiten gibt einer Funktion die Kürzel zurück, die ihr die Systemdatei gibt. Jede Änderung lässt sich rückgängig machen und wiederholen (Strg+Z, Strg+Umschalt+Z).&lt;/p&gt;</translation>
+        <translation>&lt;h3&gt;Kürzel&lt;/h3&gt;&lt;p&gt;Wählen Sie eine Zeile, klicken Sie auf &lt;b&gt;Kürzel zuweisen:&lt;/b&gt; und drücken Sie die Kombination. Eine Kombination, die eine andere Zeile hat, wird abgelehnt; &lt;b&gt;Neu zuweisen&lt;/b&gt; in dieser Meldung gibt sie Ihrer Zeile und lässt die andere ohne Kürzel. &lt;b&gt;Kürzel entfernen&lt;/b&gt; nimmt das Kürzel weg. Ein Systemkürzel, das Sie entfernen oder ändern, wird als &lt;i&gt;Disable&lt;/i&gt; in Ihre Datei geschrieben, was die Systembelegung dieses Kürzels abschaltet. &lt;b&gt;Systemkürzel wiederherstellen&lt;/b&gt; im Menü Bearbeiten gibt einer Funktion die Kürzel zurück, die ihr die Systemdatei gibt. Jede Änderung lässt sich rückgängig machen und wiederholen (Strg+Z, Strg+Umschalt+Z).&lt;/p&gt;</translation>
     </message>
     <message>
         <source>&lt;h3&gt;Finding&lt;/h3&gt;&lt;p&gt;Type into the field above the tree (Ctrl+F) to see only the rows whose action, function, command or key holds the text; a key may be typed as Ctrl+Alt+T or Ctrl|Alt|t. &lt;b&gt;Find key&lt;/b&gt; records a combination and shows who holds it, or says that it is free.&lt;/p&gt;</source>
@@ -968,10 +975,6 @@
         <translation>Datei kann nicht angelegt werden: </translation>
     </message>
     <message>
-        <source>The file is larger than 16 MiB</source>
-        <translation>Die Datei ist größer als 16 MiB</translation>
-    </message>
-    <message>
         <source>Can&apos;t copy %1
 to %2</source>
         <translation>%1
@@ -1057,7 +1060,7 @@ Nach einem Neustart verwendet zem-wm „%2“.</translation>
     </message>
     <message>
         <source>Reassign %1 from %2 to %3</source>
-        <translation>%1 von %2 an %3 übergeben</translation>
+        <translation>%1 von %2 neu an %3 zuweisen</translation>
     </message>
     <message>
         <source>Assign %1 to %2</source>
@@ -1085,7 +1088,7 @@ Bitte wählen Sie eine eindeutige Tastenkombination.</translation>
     <message>
         <source>Reassign</source>
         <extracomment>Moves the key combination to the edited row, leaving the other one without a key.</extracomment>
-        <translation>Übergeben</translation>
+        <translation>Neu zuweisen</translation>
     </message>
     <message>
         <source>Clear the key of %1</source>
@@ -1127,6 +1130,14 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
         <translation>Die System-Tastenkürzeldatei %1 wurde seit dem Laden von einem anderen Programm geändert.
 %2 mit Ihren Änderungen überschreiben, beide neu laden und die Änderungen verwerfen, oder abbrechen?</translation>
     </message>
+    <message>
+        <source>Saved %1</source>
+        <translation>%1 gespeichert</translation>
+    </message>
+    <message>
+        <source>The window manager was told to reload %1</source>
+        <translation>Der Fenstermanager wurde angewiesen, %1 neu zu laden</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -1163,6 +1174,10 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
     <message>
         <source>the file name is not valid in the locale&apos;s encoding</source>
         <translation>der Dateiname ist in der Kodierung der Sprachumgebung ungültig</translation>
+    </message>
+    <message>
+        <source>an editor already runs on this display and was brought forward; %1 was not opened there</source>
+        <translation>auf dieser Anzeige läuft bereits ein Editor und wurde nach vorn geholt; %1 wurde dort nicht geöffnet</translation>
     </message>
 </context>
 <context>

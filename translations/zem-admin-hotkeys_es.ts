@@ -2,6 +2,13 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="es_ES">
 <context>
+    <name>EditedFile</name>
+    <message>
+        <source>No file name</source>
+        <translation>Sin nombre de archivo</translation>
+    </message>
+</context>
+<context>
     <name>Handbook</name>
     <message>
         <source>Zem hotkeys editor Handbook</source>
@@ -968,10 +975,6 @@
         <translation>No se puede crear el archivo </translation>
     </message>
     <message>
-        <source>The file is larger than 16 MiB</source>
-        <translation>El archivo ocupa más de 16 MiB</translation>
-    </message>
-    <message>
         <source>Can&apos;t copy %1
 to %2</source>
         <translation>No se puede copiar %1
@@ -1127,6 +1130,14 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
         <translation>Otro programa cambió el archivo de atajos del sistema %1 desde que se cargó.
 ¿Sobrescribir %2 con sus cambios, recargar ambos y descartarlos, o cancelar?</translation>
     </message>
+    <message>
+        <source>Saved %1</source>
+        <translation>%1 guardado</translation>
+    </message>
+    <message>
+        <source>The window manager was told to reload %1</source>
+        <translation>Se pidió al gestor de ventanas que vuelva a cargar %1</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -1163,6 +1174,10 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
     <message>
         <source>the file name is not valid in the locale&apos;s encoding</source>
         <translation>el nombre de archivo no es válido en la codificación de la configuración regional</translation>
+    </message>
+    <message>
+        <source>an editor already runs on this display and was brought forward; %1 was not opened there</source>
+        <translation>ya se ejecuta un editor en esta pantalla y se ha traído al frente; %1 no se abrió en él</translation>
     </message>
 </context>
 <context>

@@ -2,6 +2,13 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="fr_FR">
 <context>
+    <name>EditedFile</name>
+    <message>
+        <source>No file name</source>
+        <translation>Aucun nom de fichier</translation>
+    </message>
+</context>
+<context>
     <name>Handbook</name>
     <message>
         <source>Zem hotkeys editor Handbook</source>
@@ -968,10 +975,6 @@
         <translation>Impossible de créer le fichier </translation>
     </message>
     <message>
-        <source>The file is larger than 16 MiB</source>
-        <translation>Le fichier dépasse 16 Mio</translation>
-    </message>
-    <message>
         <source>Can&apos;t copy %1
 to %2</source>
         <translation>Impossible de copier %1
@@ -1127,6 +1130,14 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
         <translation>Le fichier de raccourcis du système %1 a été modifié par un autre programme depuis son chargement.
 Écraser %2 avec vos modifications, recharger les deux et abandonner vos modifications, ou annuler ?</translation>
     </message>
+    <message>
+        <source>Saved %1</source>
+        <translation>%1 enregistré</translation>
+    </message>
+    <message>
+        <source>The window manager was told to reload %1</source>
+        <translation>Le gestionnaire de fenêtres a été prié de relire %1</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -1163,6 +1174,10 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
     <message>
         <source>the file name is not valid in the locale&apos;s encoding</source>
         <translation>le nom de fichier n&apos;est pas valide dans l&apos;encodage de la locale</translation>
+    </message>
+    <message>
+        <source>an editor already runs on this display and was brought forward; %1 was not opened there</source>
+        <translation>un éditeur tourne déjà sur cet écran et a été mis au premier plan ; %1 n&apos;y a pas été ouvert</translation>
     </message>
 </context>
 <context>

@@ -2,6 +2,13 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="ru_RU">
 <context>
+    <name>EditedFile</name>
+    <message>
+        <source>No file name</source>
+        <translation>Нет имени файла</translation>
+    </message>
+</context>
+<context>
     <name>Handbook</name>
     <message>
         <source>Zem hotkeys editor Handbook</source>
@@ -969,10 +976,6 @@
         <translation>Не удаётся создать файл </translation>
     </message>
     <message>
-        <source>The file is larger than 16 MiB</source>
-        <translation>Файл больше 16 МиБ</translation>
-    </message>
-    <message>
         <source>Can&apos;t copy %1
 to %2</source>
         <translation>Не удаётся скопировать %1
@@ -1129,6 +1132,14 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
         <translation>Системный файл горячих клавиш %1 был изменён другой программой после загрузки.
 Перезаписать %2 вашими правками, перезагрузить оба и отбросить их или отменить?</translation>
     </message>
+    <message>
+        <source>Saved %1</source>
+        <translation>%1 сохранён</translation>
+    </message>
+    <message>
+        <source>The window manager was told to reload %1</source>
+        <translation>Оконному менеджеру сказано перечитать %1</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -1165,6 +1176,10 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
     <message>
         <source>the file name is not valid in the locale&apos;s encoding</source>
         <translation>имя файла недопустимо в кодировке локали</translation>
+    </message>
+    <message>
+        <source>an editor already runs on this display and was brought forward; %1 was not opened there</source>
+        <translation>на этом дисплее уже работает редактор, он выведен на передний план; %1 в нём не открыт</translation>
     </message>
 </context>
 <context>

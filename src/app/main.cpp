@@ -61,6 +61,14 @@ int main(int argc, char** argv)
     auto* app = new MyApplication(singleInstanceId(), argc, argv);
     if (app->isRunning()) {
         app->sendMessage(QStringLiteral("show"), 5000);
+        // What was asked of this start is not done: the running editor keeps its own file.
+        if (argc > 1)
+            std::fprintf(stderr, "zem-admin-hotkeys: %s\n",
+                         QObject::tr("an editor already runs on this display and was brought forward; "
+                                     "%1 was not opened there")
+                             .arg(printableText(QFile::decodeName(argv[1])))
+                             .toLocal8Bit()
+                             .constData());
         delete app;
         return AnotherInstanceShown;
     }

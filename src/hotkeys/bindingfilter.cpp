@@ -2,8 +2,20 @@
 
 #include "keyforms.h"
 
+#include <QKeySequence>
+
 BindingFilter::BindingFilter(const QString& text) : text(text.trimmed().toLower()), key(keyFromUserText(text))
 {
+    // A text that names a combination with a modifier, or a key that types no character (F1,
+    // Print), is looked for as that key, not as part of another: "ctrl+alt+l" is not
+    // Ctrl+Alt+Left.
+    const QKeySequence sequence = QKeySequence::fromString(key, QKeySequence::PortableText);
+    const int combined = sequence.isEmpty() ? 0 : sequence[0];
+    const int bare = combined & ~int(Qt::KeyboardModifierMask);
+    wholeKey =
+        !key.isEmpty() &&
+        ((combined & int(Qt::ControlModifier | Qt::AltModifier | Qt::MetaModifier | Qt::ShiftModifier)) ||
+         bare >= Qt::Key_Escape);
 }
 
 QString BindingFilter::searchText(const QString& action, const QString& function, const QString& shownKey)
@@ -15,6 +27,10 @@ QString BindingFilter::searchText(const QString& action, const QString& function
 
 bool BindingFilter::matches(const QString& searchText, const QString& storedKey) const
 {
-    return text.isEmpty() || searchText.contains(text) ||
-           (!key.isEmpty() && storedKey.compare(key, Qt::CaseInsensitive) == 0);
+    if (text.isEmpty() || (!key.isEmpty() && storedKey.compare(key, Qt::CaseInsensitive) == 0))
+        return true;
+    // The shown key is the last of the fields; a whole key is not looked for inside it.
+    return (wholeKey ? QStringRef(&searchText, 0, searchText.lastIndexOf(QLatin1Char('\n')))
+                     : QStringRef(&searchText))
+        .contains(text);
 }

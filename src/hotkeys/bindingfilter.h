@@ -19,4 +19,5 @@ public:
 private:
     QString text;
     QString key;
+    bool wholeKey = false; // the text names a key that is only ever matched whole
 };

@@ -151,6 +151,8 @@ bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBy
                 if (function >= 0)
                     fresh.systemBindings[function].append(
                         Binding{0, function, QString(), key, fileKey, source, origin, false});
+                else if (!value.startsWith(QLatin1String("ZEMWM_")))
+                    fresh.systemCommands.append(Binding{0, -1, value, key, fileKey, source, origin, false});
             }
             // Whoever bound the key first keeps it: the user's file before the system one.
             if (isKey && boundKeys.contains(entry.identity))
@@ -398,13 +400,80 @@ bool HotkeysModel::differsFromSystem(int function) const
     return false;
 }
 
-QStringList HotkeysModel::revertToSystem(int function)
+bool HotkeysModel::canRevert(BindingId id) const
+{
+    const Binding* row = find(id);
+    if (!row)
+        return false;
+    if (!row->isCommand())
+        return differsFromSystem(row->function);
+    const auto given = std::find_if(systemCommands.cbegin(), systemCommands.cend(),
+                                    [&](const Binding& b) { return b.command == row->command; });
+    return given != systemCommands.cend() &&
+           (row->source != BindingSource::System || keyIdentity(row->fileKey) != keyIdentity(given->fileKey));
+}
+
+QStringList HotkeysModel::revert(BindingId id, BindingId* focus)
+{
+    Binding* row = findMutable(id);
+    if (!row)
+        return QStringList();
+    if (row->isCommand()) {
+        if (focus)
+            *focus = id;
+        return revertCommand(row);
+    }
+    const int function = row->function;
+    const QStringList held = revertFunction(function);
+    if (focus)
+        *focus = functionRows.at(function).first().id;
+    return held;
+}
+
+void HotkeysModel::giveBackOrKeepOff(const Binding& freed)
+{
+    const QByteArray identity = keyIdentity(freed.fileKey);
+    if (freed.key.isEmpty() || holderOfFileKey(freed.fileKey))
+        return;
+    // The row the system file gives the key to, where it has none now (a Reassign took it).
+    const auto giveTo = [&](Binding* row, const Binding& given) {
+        row->key = given.key;
+        row->fileKey = given.fileKey;
+        row->source = BindingSource::System;
+        row->origin = given.origin;
+        row->keyRecorded = false;
+        enable(given.fileKey);
+    };
+    for (auto it = systemBindings.cbegin(); it != systemBindings.cend(); ++it) {
+        for (const Binding& given : *it) {
+            if (keyIdentity(given.fileKey) != identity)
+                continue;
+            for (Binding& row : functionRows[it.key()]) {
+                if (row.key.isEmpty()) {
+                    giveTo(&row, given);
+                    return;
+                }
+            }
+        }
+    }
+    for (const Binding& given : qAsConst(systemCommands)) {
+        if (keyIdentity(given.fileKey) != identity)
+            continue;
+        for (Binding& row : commandRows) {
+            if (row.key.isEmpty() && row.command == given.command) {
+                giveTo(&row, given);
+                return;
+            }
+        }
+    }
+    keepFreedKeyOff(freed);
+}
+
+QStringList HotkeysModel::revertFunction(int function)
 {
     QVector<Binding>& rows = functionRows[function];
     const QVector<Binding> old = rows;
     rows.clear();
-    for (const Binding& row : old)
-        keepFreedKeyOff(row);
     QStringList heldElsewhere;
     for (const Binding& binding : systemBindings.value(function)) {
         if (holderOfFileKey(binding.fileKey)) {
@@ -420,6 +489,31 @@ QStringList HotkeysModel::revertToSystem(int function)
     if (rows.isEmpty())
         rows.append(Binding{++lastId, function, QString(), QString(), QByteArray(), BindingSource::Unset,
                             nullptr, false});
+    for (const Binding& row : old)
+        giveBackOrKeepOff(row);
+    return heldElsewhere;
+}
+
+QStringList HotkeysModel::revertCommand(Binding* row)
+{
+    const Binding old = *row;
+    QStringList heldElsewhere;
+    for (const Binding& given : qAsConst(systemCommands)) {
+        if (given.command != row->command)
+            continue;
+        if (holderOfFileKey(given.fileKey, row->id)) {
+            heldElsewhere << given.key;
+            continue;
+        }
+        row->key = given.key;
+        row->fileKey = given.fileKey;
+        row->source = BindingSource::System;
+        row->origin = given.origin;
+        row->keyRecorded = false;
+        enable(given.fileKey);
+        giveBackOrKeepOff(old);
+        return QStringList();
+    }
     return heldElsewhere;
 }
 

@@ -110,11 +110,14 @@ public:
     bool removeRow(BindingId id);
     // The key moves from the row that holds it, which is left without one, to the target row.
     void reassign(BindingId holder, BindingId target);
-    // Whether the function's rows are other than those the system file gives it.
-    bool differsFromSystem(int function) const;
-    // Makes the function's rows those the system file gives it, their keys no longer disabled;
-    // gives back the system keys that other rows hold, which stay with them.
-    QStringList revertToSystem(int function);
+    // Whether the row is one the system file gives (a function it binds, or a command line it
+    // runs) and differs from what the system file gives.
+    bool canRevert(BindingId id) const;
+    // Makes the row's function, or the command row, what the system file gives, its keys no
+    // longer disabled. A key this frees that the system file gives to a row now without a key
+    // goes back to that row. Gives back the system keys that other rows hold, which stay with
+    // them; `focus` (when given) becomes the row the revert is about afterwards.
+    QStringList revert(BindingId id, BindingId* focus = nullptr);
 
     // The file's bytes: the file read, with the lines of every key whose meaning changed
     // rewritten in place, removed or added (only the user's rows count when userFile).
@@ -136,6 +139,12 @@ private:
     // The system file's rows of the function, as loading arranges them, less the keys that rows
     // of other functions hold.
     QVector<Binding> systemRowsOf(int function) const;
+    bool differsFromSystem(int function) const;
+    QStringList revertFunction(int function);
+    QStringList revertCommand(Binding* row);
+    // The key of a row the revert took it from, back to the row without a key the system file
+    // gives it to; false when there is none, and then it is switched off as any freed key.
+    void giveBackOrKeepOff(const Binding& freed);
     void assignPlaceholders(bool userFile);
 
     QVector<QVector<Binding>> functionRows;
@@ -144,6 +153,7 @@ private:
     QVector<Kept> kept;
     // What the system file binds: each function's keys in the order read, and every key.
     QHash<int, QVector<Binding>> systemBindings;
+    QVector<Binding> systemCommands;
     QSet<QByteArray> systemKeys;
     // The edited file as read: its bytes, lines and entries, which writing patches.
     std::shared_ptr<const HotkeysEntries> base;

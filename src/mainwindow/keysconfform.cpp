@@ -107,6 +107,14 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     editCommandAction->setShortcut(Qt::Key_Return);
     deleteCommandAction = makeAction(this, tr("&Delete"), "edit-delete");
     deleteCommandAction->setShortcut(Qt::Key_Delete);
+    // The desktop's own keys for the file commands; Apply, which saves and hands over, gets
+    // Ctrl+Return.
+    fileNewAction->setShortcut(QKeySequence::New);
+    fileOpenAction->setShortcut(QKeySequence::Open);
+    fileSaveAction->setShortcut(QKeySequence::Save);
+    fileSaveAsAction->setShortcut(QKeySequence::SaveAs);
+    fileExitAction->setShortcut(QKeySequence::Quit);
+    fileApplyAction->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_Return));
     const std::pair<QAction*, const char*> names[] = {
         {fileNewAction, "fileNewAction"},
         {fileOpenAction, "fileOpenAction"},
@@ -321,9 +329,8 @@ void KeysConfForm::itemSelectionChanged()
 
 void KeysConfForm::updateRevertAction()
 {
-    const Binding* binding = model.find(bindingAt(targetRow()));
-    revertAction->setEnabled(binding && !binding->isCommand() && currentFile == userHotkeysFilePath() &&
-                             model.differsFromSystem(binding->function));
+    revertAction->setEnabled(edited->isMerged() && currentFile == edited->path() &&
+                             model.canRevert(bindingAt(targetRow())));
 }
 
 void KeysConfForm::edit(const QString& text, BindingId focus, const HotkeysModel& after)

@@ -171,6 +171,8 @@ private:
     std::unique_ptr<BindingTree> bindingTree;
     QString saveError;
     EditedFile::SaveResult lastSave = EditedFile::SaveResult::Saved;
+    // A save, or a file chosen, since the window manager was last told to read the file.
+    bool unapplied = false;
     // What was on disk when the user agreed to overwrite it.
     QByteArray acceptedDiskState;
     QUndoStack* undoStack = nullptr;

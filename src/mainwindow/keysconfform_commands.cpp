@@ -76,13 +76,12 @@ void KeysConfForm::deleteCommand()
 void KeysConfForm::revertToSystemBinding()
 {
     const BindingId id = bindingAt(targetRow());
-    const Binding* binding = model.find(id);
-    if (!binding || binding->isCommand() || currentFile != userHotkeysFilePath())
+    if (!model.canRevert(id) || currentFile != userHotkeysFilePath())
         return;
     HotkeysModel after = model;
-    const QString text = targetRow()->text(0);
-    const QStringList heldElsewhere = after.revertToSystem(binding->function);
-    edit(tr("Revert %1 to the system binding").arg(text), after.rowsOf(binding->function).first().id, after);
+    BindingId focus = id;
+    const QStringList heldElsewhere = after.revert(id, &focus);
+    edit(tr("Revert %1 to the system binding").arg(targetRow()->text(0)), focus, after);
     if (!heldElsewhere.isEmpty()) {
         QStringList shown;
         for (const QString& key : heldElsewhere)

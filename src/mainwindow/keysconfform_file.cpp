@@ -11,6 +11,7 @@
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QMessageBox>
+#include <QStatusBar>
 #include <QTimer>
 #include <QTreeWidget>
 #include <QUndoStack>
@@ -24,7 +25,8 @@ void KeysConfForm::updateTitle()
     const QString name = QFileInfo(currentFile).fileName();
     if (!name.isEmpty())
         title += QLatin1String(" - ") + name;
-    setWindowTitle(title);
+    // The unsaved mark stands in the title only while there are unsaved edits.
+    setWindowTitle(title + QLatin1String("[*]"));
     setWindowIconText(tr("Zem hotkeys editor"));
 }
 
@@ -33,13 +35,16 @@ void KeysConfForm::fileChanged()
     // Unsaved edits are the steps between the clean state of the undo stack and now.
     modified = !undoStack->isClean();
     fileSaveAction->setEnabled(modified);
-    fileApplyAction->setEnabled(modified);
+    // A file saved but not yet handed to the window manager still has something to apply.
+    fileApplyAction->setEnabled(modified || unapplied);
+    setWindowModified(modified);
     updateRevertAction();
 }
 
 void KeysConfForm::startAfresh()
 {
     // The file as it now stands counts as edited: Save rewrites it and Apply hands it over.
+    unapplied = true;
     undoStack->clear();
     undoStack->resetClean();
     fileChanged();
@@ -137,7 +142,9 @@ bool KeysConfForm::loadFile(const QString& path)
     // user has not begun to type, so that the first keystroke does not wait for it.
     applyFilter();
     QTimer::singleShot(0, this, [this] { bindingTree->searchRows(); });
-    // A loaded file has nothing to undo and no unsaved edits.
+    // A loaded file has nothing to undo and no unsaved edits; as the window manager's own
+    // file at start-up, or reloaded because it changed, it counts as applied.
+    unapplied = false;
     undoStack->clear();
     fileChanged();
     return true;
@@ -235,8 +242,10 @@ void KeysConfForm::fileSave()
 {
     // A failed save keeps the edits marked unsaved, so that they are still offered for saving.
     if (saveFileOrWarn()) {
+        unapplied = true;
         undoStack->setClean();
         fileChanged();
+        statusBar()->showMessage(tr("Saved %1").arg(QFileInfo(currentFile).fileName()));
     }
 }
 
@@ -297,10 +306,16 @@ void KeysConfForm::fileApply()
                                  .arg(currentFile, startupFile),
                              QMessageBox::Ok);
     }
-    if (!SendCommandToWM(QX11Info::display(), command.constData()))
+    if (!SendCommandToWM(QX11Info::display(), command.constData())) {
         QMessageBox::warning(this, tr("Error"),
                              tr("The window manager could not be told to reload %1.").arg(currentFile),
                              QMessageBox::Ok);
+        return;
+    }
+    unapplied = false;
+    fileChanged();
+    statusBar()->showMessage(
+        tr("The window manager was told to reload %1").arg(QFileInfo(currentFile).fileName()));
 }
 
 void KeysConfForm::fileClose()

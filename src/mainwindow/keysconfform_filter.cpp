@@ -103,6 +103,13 @@ void KeysConfForm::applyFilter()
     }
     wasFiltering = filtering;
     keysTree->setUpdatesEnabled(true);
+    // The key panel acts only on a row that is shown: a row the filter hides is let go.
+    QTreeWidgetItem* current = keysTree->currentItem();
+    if (current && (current->isHidden() || (current->parent() && current->parent()->isHidden()))) {
+        keysTree->setCurrentItem(nullptr);
+        keysTree->clearSelection();
+        itemSelected(nullptr);
+    }
     //: Shown while a filter is active, for example "3 of 186 bindings".
     filterStatus->setText(filtering ? tr("%1 of %n bindings", nullptr, total).arg(shown) : QString());
 }
@@ -129,6 +136,13 @@ void KeysConfForm::findKey(const QKeySequence& seq)
 
 bool KeysConfForm::eventFilter(QObject* watched, QEvent* event)
 {
+    // Undo and redo are the bindings' everywhere in the window: the field does not claim them
+    // for its text, so the Edit menu's shortcuts take them.
+    if (watched == filterEdit && event->type() == QEvent::ShortcutOverride) {
+        const auto* press = static_cast<QKeyEvent*>(event);
+        if (press->matches(QKeySequence::Undo) || press->matches(QKeySequence::Redo))
+            return true;
+    }
     if (watched != filterEdit || event->type() != QEvent::KeyPress)
         return QMainWindow::eventFilter(watched, event);
     const int key = static_cast<QKeyEvent*>(event)->key();

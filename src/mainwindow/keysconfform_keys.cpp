@@ -77,8 +77,11 @@ void KeysConfForm::setKey(const QKeySequence& seq)
     const QString key = seq.toString(QKeySequence::PortableText);
     const QString shown = seq.toString(QKeySequence::NativeText);
     if (isKeyPresent(seq, true)) {
-        if (!reassignChosen)
+        if (!reassignChosen) {
+            // The panel shows the row's own key again, not the one refused.
+            itemSelected(keysTree->currentItem());
             return;
+        }
         // The key moves here; the row that held it is left without one.
         const BindingId holder = model.holderOf(key, id);
         const QString holderText = bindingTree->rowOf(holder)->text(0);

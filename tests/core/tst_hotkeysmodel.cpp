@@ -147,13 +147,13 @@ void TestHotkeysModel::writeBack_data()
         << QByteArray("[ShortCutKeys]\nCtrl|Prior=ZEMWM_TOP\nCtrl|Page_Up=ZEMWM_LEFT\n") << "clear|ZEMWM_LEFT"
         << QByteArray("[ShortCutKeys]\n");
     // What an edit keeps of its line.
-    const QByteArray commented = "[ShortCutKeys]\n; terminal\nCtrl|Alt|t=\"xterm\"\r\nAlt|F5=ZEMWM_LOCK\n";
+    const QByteArray commented = "[ShortCutKeys]\n; terminal\nCtrl|Alt|u=\"xclock\"\r\nAlt|F5=ZEMWM_LOCK\n";
     QTest::newRow("a binding given a new key keeps its line, its place and its comment")
-        << commented << "key|cmd:xterm|Ctrl+Alt+Y"
-        << QByteArray("[ShortCutKeys]\n; terminal\nCtrl|Alt|y=\"xterm\"\r\nAlt|F5=ZEMWM_LOCK\n");
+        << commented << "key|cmd:xclock|Ctrl+Alt+Y"
+        << QByteArray("[ShortCutKeys]\n; terminal\nCtrl|Alt|y=\"xclock\"\r\nAlt|F5=ZEMWM_LOCK\n");
     QTest::newRow("a command left without a key keeps its line under a placeholder")
-        << commented << "clear|cmd:xterm"
-        << QByteArray("[ShortCutKeys]\n; terminal\nNone|None0=\"xterm\"\r\nAlt|F5=ZEMWM_LOCK\n");
+        << commented << "clear|cmd:xclock"
+        << QByteArray("[ShortCutKeys]\n; terminal\nNone|None0=\"xclock\"\r\nAlt|F5=ZEMWM_LOCK\n");
     QTest::newRow("a new key keeps the value's bytes")
         << QByteArray("[ShortCutKeys]\nCtrl|l=\"echo caf\xe9\"\n") << "key|cmd:echo caf\xef\xbf\xbd|Ctrl+E"
         << QByteArray("[ShortCutKeys]\nCtrl|e=\"echo caf\xe9\"\n");
@@ -161,8 +161,8 @@ void TestHotkeysModel::writeBack_data()
         << QByteArray("[ShortCutKeys]\nAlt|n=ZEMWM_NEWER\n") << "key|ZEMWM_LOCK|Alt+N"
         << QByteArray("[ShortCutKeys]\nAlt|n=ZEMWM_LOCK\n");
     QTest::newRow("a keyless command gets a placeholder no other entry has")
-        << QByteArray("[ShortCutKeys]\nNone|None0=\"xterm\"\n") << "add||xclock"
-        << QByteArray("[ShortCutKeys]\nNone|None0=\"xterm\"\nNone|None1=\"xclock\"\n");
+        << QByteArray("[ShortCutKeys]\nNone|None0=\"xclock\"\n") << "add||xclock"
+        << QByteArray("[ShortCutKeys]\nNone|None0=\"xclock\"\nNone|None1=\"xclock\"\n");
     // The merged view's rules, written.
     QTest::newRow("clearing a system key disables it in the system file's spelling")
         << QByteArray("[ShortCutKeys]\n") << "clear|ZEMWM_CLOSE"
@@ -179,6 +179,12 @@ void TestHotkeysModel::writeBack_data()
     QTest::newRow("revert: the system's rows, their keys no longer disabled")
         << QByteArray("[ShortCutKeys]\nAlt|F9=ZEMWM_CLOSE\nAlt|F4=Disable\n") << "revert|ZEMWM_CLOSE"
         << QByteArray("[ShortCutKeys]\n");
+    QTest::newRow("reassign, then revert: the key goes back to the row it was taken from")
+        << QByteArray("[ShortCutKeys]\n") << "reassign|cmd:xterm|ZEMWM_CLOSE;revert|ZEMWM_CLOSE"
+        << QByteArray("[ShortCutKeys]\n");
+    QTest::newRow("revert a command row: the system's key, the user's switched back on")
+        << QByteArray("[ShortCutKeys]\nCtrl|Alt|x=\"xterm\"\nCtrl|Alt|t=\"Disable\"\n") << "revert|cmd:xterm"
+        << QByteArray("[ShortCutKeys]\n");
     QTest::newRow("a multi-key sequence is written with its first key")
         << QByteArray("[ShortCutKeys]\n") << "key|ZEMWM_LOCK|Ctrl+A, B"
         << QByteArray("[ShortCutKeys]\nCtrl|a=ZEMWM_LOCK\n");
@@ -191,23 +197,26 @@ void TestHotkeysModel::writeBack()
     QFETCH(QByteArray, written);
 
     HotkeysModel model;
-    // The system file binds Alt+F4 in its own spelling.
-    QVERIFY(model.loadBytes(file, "[ShortCutKeys]\nALT|f4=ZEMWM_CLOSE\n", true));
-    const QStringList words = edit.split(QLatin1Char('|'));
-    const BindingId id =
-        words.first() == QLatin1String("add") ? model.addCommand(words.at(2)) : rowOf(model, words.at(1));
-    const QString rest = words.value(2);
-    if (words.first() == QLatin1String("key"))
-        model.setKey(id, rest);
-    else if (words.first() == QLatin1String("clear"))
-        model.clearKey(id);
-    else if (words.first() == QLatin1String("command"))
-        model.setCommand(id, rest);
-    else if (words.first() == QLatin1String("reassign"))
-        model.reassign(id, rowOf(model, rest));
-    else if (words.first() == QLatin1String("revert"))
-        QCOMPARE(model.revertToSystem(model.find(id)->function), QStringList());
-    QVERIFY2(id, "no such row");
+    // The system file binds Alt+F4 in its own spelling, and Ctrl+Alt+T to a command.
+    QVERIFY(model.loadBytes(file, "[ShortCutKeys]\nALT|f4=ZEMWM_CLOSE\nCtrl|Alt|t=\"xterm\"\n", true));
+    // Edits one after the other, separated by ";".
+    for (const QString& step : edit.split(QLatin1Char(';'))) {
+        const QStringList words = step.split(QLatin1Char('|'));
+        const BindingId id =
+            words.first() == QLatin1String("add") ? model.addCommand(words.at(2)) : rowOf(model, words.at(1));
+        QVERIFY2(id, "no such row");
+        const QString rest = words.value(2);
+        if (words.first() == QLatin1String("key"))
+            model.setKey(id, rest);
+        else if (words.first() == QLatin1String("clear"))
+            model.clearKey(id);
+        else if (words.first() == QLatin1String("command"))
+            model.setCommand(id, rest);
+        else if (words.first() == QLatin1String("reassign"))
+            model.reassign(id, rowOf(model, rest));
+        else if (words.first() == QLatin1String("revert"))
+            QCOMPARE(model.revert(id), QStringList());
+    }
 
     QByteArray bytes;
     QString reason;

@@ -46,8 +46,11 @@ private slots:
     void init();
     void selectionShowsTheRow_data();
     void selectionShowsTheRow();
-    void recordedKeyAndConflict();
-    void saveAndApplyStates();
+    void refusedRecording();
+    void saveThenApply();
+    void reassignThenRevert();
+    void filterHidesTheSelectedRow();
+    void undoInTheFilterField();
     void failedWriteKeepsEdits_data();
     void failedWriteKeepsEdits();
     void closeQuestion_data();
@@ -160,11 +163,12 @@ void TestMainWindow::selectionShowsTheRow()
     QVERIFY(!KeysConfForm::isModified());
 }
 
-void TestMainWindow::recordedKeyAndConflict()
+void TestMainWindow::refusedRecording()
 {
-    select(QStringLiteral("ZEMWM_EXIT"));
+    select(QStringLiteral("ZEMWM_LOCK"));
     ModalAnswerer answerer;
-    // A combination the system file holds in another spelling is refused.
+    // A combination the system file holds in another spelling is refused, and the panel shows
+    // the row's own key again.
     keyWidget()->setKeySequence(QKeySequence(QStringLiteral("Ctrl+K")), KKeySequenceWidget::NoValidate);
     QCOMPARE(answerer.count(), 1);
     QCOMPARE(answerer.last().title, QStringLiteral("Whoopsie! Key conflict."));
@@ -172,37 +176,79 @@ void TestMainWindow::recordedKeyAndConflict()
              QStringLiteral(
                  "Ouch! The Ctrl+K key combination has already been allocated\nto the ZEMWM_KILL action "
                  "(close a window forcely).\n\nPlease choose a unique key combination."));
-    QVERIFY(KeysConfForm::itemKey(row("ZEMWM_EXIT")).isEmpty());
+    QCOMPARE(KeysConfForm::itemKey(row("ZEMWM_LOCK")), QStringLiteral("Alt+F5"));
+    QCOMPARE(keyWidget()->keySequence(), QKeySequence(QStringLiteral("Alt+F5")));
+    QVERIFY(!KeysConfForm::isModified());
 
     keyWidget()->setKeySequence(QKeySequence(QStringLiteral("Ctrl+Alt+E")), KKeySequenceWidget::NoValidate);
     QCOMPARE(answerer.count(), 1);
-    QCOMPARE(KeysConfForm::itemKey(row("ZEMWM_EXIT")), QStringLiteral("Ctrl+Alt+E"));
-    QCOMPARE(row("ZEMWM_EXIT")->text(3), QStringLiteral("user"));
-    QVERIFY(KeysConfForm::isModified() && saveEnabled());
+    QCOMPARE(KeysConfForm::itemKey(row("ZEMWM_LOCK")), QStringLiteral("Ctrl+Alt+E"));
+    QVERIFY(KeysConfForm::isModified() && form->isWindowModified());
 }
 
-void TestMainWindow::saveAndApplyStates()
+void TestMainWindow::saveThenApply()
 {
-    QVERIFY(!saveEnabled());
+    QAction* save = action("fileSaveAction");
+    QAction* apply = action("fileApplyAction");
+    QVERIFY(!save->isEnabled() && !apply->isEnabled());
     assign(QStringLiteral("ZEMWM_EXIT"), "Ctrl+Alt+E");
-    QVERIFY(saveEnabled());
     form->fileSave();
-    QVERIFY(!KeysConfForm::isModified() && !saveEnabled());
-    QVERIFY(readFile(userFile).contains("Ctrl|Alt|e=ZEMWM_EXIT\n"));
-    // Undoing back past the state saved leaves something to save; redoing to it, nothing.
+    // Saved but not yet handed over: nothing to save, but something to apply, also after an
+    // edit taken back.
+    QVERIFY(!save->isEnabled() && apply->isEnabled() && !form->isWindowModified());
+    QCOMPARE(form->statusBar()->currentMessage(), QStringLiteral("Saved keyshortcutrc"));
+    assign(QStringLiteral("ZEMWM_LOCK"), "Ctrl+Alt+L");
     action("undoAction")->trigger();
-    QVERIFY(KeysConfForm::isModified() && saveEnabled());
-    action("redoAction")->trigger();
-    QVERIFY(!KeysConfForm::isModified() && !saveEnabled());
-    // A refused recording changes nothing and leaves nothing to save.
-    ModalAnswerer answerer;
-    keyWidget()->setKeySequence(QKeySequence(QStringLiteral("Alt+F5")), KKeySequenceWidget::NoValidate);
-    QVERIFY(answerer.count() == 1 && !KeysConfForm::isModified());
-
-    form->setKey(QKeySequence(QStringLiteral("Ctrl+Alt+F")));
+    QVERIFY(!save->isEnabled() && apply->isEnabled());
     form->fileApply();
-    QVERIFY(!KeysConfForm::isModified() && !saveEnabled());
     QCOMPARE(takeRootProperty(), "\"ZEMWM_UPDATE_VAL SCKeysFile " + QFile::encodeName(userFile) + "\\n\"");
+    QCOMPARE(form->statusBar()->currentMessage(),
+             QStringLiteral("The window manager was told to reload keyshortcutrc"));
+    // Applied, an edit taken back leaves nothing to apply.
+    assign(QStringLiteral("ZEMWM_LOCK"), "Ctrl+Alt+L");
+    action("undoAction")->trigger();
+    QVERIFY(!save->isEnabled() && !apply->isEnabled());
+}
+
+void TestMainWindow::reassignThenRevert()
+{
+    // Reassign takes the system's Ctrl+K from ZEMWM_KILL; reverting the row that took it gives
+    // it back in the same step, and nothing is left switched off.
+    ModalAnswerer answerer({QMessageBox::Apply});
+    assign(QStringLiteral("ZEMWM_CLOSE"), "Ctrl+K");
+    QVERIFY(KeysConfForm::itemKey(row("ZEMWM_KILL")).isEmpty());
+    select(QStringLiteral("ZEMWM_CLOSE"));
+    action("revertAction")->trigger();
+    QCOMPARE(KeysConfForm::itemKey(row("ZEMWM_CLOSE")), QStringLiteral("Alt+F4"));
+    QCOMPARE(KeysConfForm::itemKey(row("ZEMWM_KILL")), QStringLiteral("Ctrl+K"));
+    QCOMPARE(row("ZEMWM_KILL")->text(3), QStringLiteral("system"));
+    QCOMPARE(form->disabledKeyList(), QStringList());
+    action("undoAction")->trigger();
+    QVERIFY(KeysConfForm::itemKey(row("ZEMWM_KILL")).isEmpty());
+}
+
+void TestMainWindow::filterHidesTheSelectedRow()
+{
+    select(QStringLiteral("ZEMWM_LOCK"));
+    QVERIFY(form->findChild<QGroupBox*>("keyGroupBox")->isEnabled());
+    form->findChild<QLineEdit*>(QStringLiteral("filterEdit"))->setText(QStringLiteral("xclock"));
+    form->applyFilter();
+    // The panel no longer acts on a row that is not shown.
+    QVERIFY(!form->findChild<QTreeWidget*>()->currentItem());
+    QVERIFY(!form->findChild<QGroupBox*>("keyGroupBox")->isEnabled());
+}
+
+void TestMainWindow::undoInTheFilterField()
+{
+    auto* filter = form->findChild<QLineEdit*>(QStringLiteral("filterEdit"));
+    assign(QStringLiteral("ZEMWM_EXIT"), "Ctrl+Alt+E");
+    form->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(form.get()));
+    filter->setFocus();
+    QTest::keyClicks(filter, QStringLiteral("exit"));
+    QTest::keyClick(filter, Qt::Key_Z, Qt::ControlModifier);
+    QVERIFY(KeysConfForm::itemKey(row("ZEMWM_EXIT")).isEmpty());
+    QCOMPARE(filter->text(), QStringLiteral("exit"));
 }
 
 void TestMainWindow::failedWriteKeepsEdits_data()
