@@ -20,6 +20,7 @@
 #include <QMenuBar>
 #include <QRadioButton>
 #include <QSessionManager>
+#include <QScreen>
 #include <QSettings>
 #include <QTimer>
 #include <QToolBar>
@@ -64,7 +65,8 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     keysTree->setObjectName(QStringLiteral("keysTree"));
     keysTree->setSortingEnabled(false);
     keysTree->setHeaderLabels({tr("Action"), tr("Current Key"), tr("zem-wm function"), tr("Source")});
-    keysTree->setSizePolicy(QSizePolicy::MinimumExpanding, QSizePolicy::MinimumExpanding);
+    // The tree takes the room there is and scrolls, so that the window fits small screens.
+    keysTree->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Expanding);
     keysTree->setAllColumnsShowFocus(true);
     keysTree->header()->setContextMenuPolicy(Qt::CustomContextMenu);
     connect(keysTree->header(), &QHeaderView::customContextMenuRequested, this,
@@ -276,8 +278,11 @@ void KeysConfForm::restoreWindowState()
         restoreState(settings.value(QStringLiteral("/MainWinState")).toByteArray(), 0);
     const int width = settings.value(QStringLiteral("/Width"), QStringLiteral("800")).toInt();
     const int height = settings.value(QStringLiteral("/Height"), QStringLiteral("600")).toInt();
+    // A saved size, or the first start's 800x600, from a larger screen or a smaller scale must
+    // not open the window beyond the screen it is on.
+    const QRect available = screen()->availableGeometry();
     if (width != 0 && height != 0)
-        resize(width, height);
+        resize(qMin(width, available.width()), qMin(height, available.height()));
     if (settings.value(QStringLiteral("/Maximized"), QStringLiteral("false")).toBool())
         setWindowState(windowState() | Qt::WindowMaximized);
 

@@ -14,6 +14,8 @@
 #include <QPushButton>
 #include <QRadioButton>
 #include <QRandomGenerator>
+#include <QScreen>
+#include <QSettings>
 #include <QStatusBar>
 #include <QTreeWidget>
 #include <QTreeWidgetItemIterator>
@@ -51,6 +53,7 @@ private slots:
     void reassignThenRevert();
     void filterHidesTheSelectedRow();
     void undoInTheFilterField();
+    void fitsTheScreen();
     void failedWriteKeepsEdits_data();
     void failedWriteKeepsEdits();
     void closeQuestion_data();
@@ -249,6 +252,23 @@ void TestMainWindow::undoInTheFilterField()
     QTest::keyClick(filter, Qt::Key_Z, Qt::ControlModifier);
     QVERIFY(KeysConfForm::itemKey(row("ZEMWM_EXIT")).isEmpty());
     QCOMPARE(filter->text(), QStringLiteral("exit"));
+}
+
+void TestMainWindow::fitsTheScreen()
+{
+    // A size saved on a larger screen is shrunk to this one, and the window can be as small as a
+    // 1024x700 screen at scale factor 2.
+    QSettings().setValue(QStringLiteral("/Width"), 9000);
+    QSettings().setValue(QStringLiteral("/Height"), 9000);
+    form.reset();
+    form = std::make_unique<KeysConfForm>();
+    QVERIFY(form->init(userFile));
+    const QRect available = form->screen()->availableGeometry();
+    QVERIFY(form->width() <= available.width() && form->height() <= available.height());
+    QVERIFY2(form->minimumSizeHint().width() <= 512 && form->minimumSizeHint().height() <= 350,
+             qPrintable(QStringLiteral("%1x%2")
+                            .arg(form->minimumSizeHint().width())
+                            .arg(form->minimumSizeHint().height())));
 }
 
 void TestMainWindow::failedWriteKeepsEdits_data()
