@@ -43,6 +43,17 @@ KKeySequenceButton::KKeySequenceButton(KKeySequenceWidgetPrivate* d, QWidget* pa
 
 KKeySequenceButton::~KKeySequenceButton() = default;
 
+bool KKeySequenceButton::eventFilter(QObject* watched, QEvent* event)
+{
+    if (d->recording && event->type() == QEvent::MouseButtonPress) {
+        auto* widget = qobject_cast<QWidget*>(watched);
+        // The press still reaches its target: the clear button clears, and this one records anew.
+        if (widget && widget != this)
+            d->cancelRecording();
+    }
+    return QPushButton::eventFilter(watched, event);
+}
+
 bool KKeySequenceButton::event(QEvent* event)
 {
     if (d->recording) {

@@ -16,6 +16,8 @@ public:
 
 protected:
     bool event(QEvent* event) override;
+    // While recording: a mouse press anywhere else in the application ends the recording.
+    bool eventFilter(QObject* watched, QEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void keyReleaseEvent(QKeyEvent* event) override;
 

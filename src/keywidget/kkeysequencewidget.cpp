@@ -4,7 +4,9 @@
 #include "kkeysequencewidget_p.h"
 
 #include <KKeyServer>
+#include <QApplication>
 #include <QHBoxLayout>
+#include <QWindow>
 #include <QIcon>
 #include <QMessageBox>
 #include <QToolButton>
@@ -47,12 +49,29 @@ void KKeySequenceWidgetPrivate::beginRecording()
     recording = true;
     recordButton->grabKeyboard();
     recordButton->setDown(true);
+    // A recording ends when the user turns elsewhere: a click outside the button, or another
+    // window (of this program too) becoming the active one. The keyboard grab itself moves no
+    // window's focus, so it does not end it.
+    qApp->installEventFilter(recordButton);
+    windowWatch = QObject::connect(qApp, &QGuiApplication::focusWindowChanged, recordButton, [this](QWindow* now) {
+        if (recording && now != recordButton->window()->windowHandle())
+            cancelRecording();
+    });
     refreshButtonText();
+}
+
+void KKeySequenceWidgetPrivate::cancelRecording()
+{
+    sequence = previousSequence;
+    previousSequence = sequence;
+    finishRecording();
 }
 
 void KKeySequenceWidgetPrivate::finishRecording()
 {
     releaseTimer.stop();
+    qApp->removeEventFilter(recordButton);
+    QObject::disconnect(windowWatch);
     recording = false;
     recordButton->releaseKeyboard();
     recordButton->setDown(false);

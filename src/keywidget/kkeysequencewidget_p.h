@@ -21,6 +21,8 @@ public:
     void setup();
     void beginRecording();
     void finishRecording();
+    // Ends a recording without a new sequence: the one from before stays, and nothing is told.
+    void cancelRecording();
     void refreshButtonText();
     // A key press that Qt could not name: warn, and go back to the sequence before.
     void unsupportedKey();
@@ -36,6 +38,7 @@ public:
     static constexpr int longestSequence = 4;
 
     KKeySequenceWidget* owner;
+    QMetaObject::Connection windowWatch;
     QHBoxLayout* layout = nullptr;
     KKeySequenceButton* recordButton = nullptr;
     QToolButton* clearSequenceButton = nullptr;

@@ -25,6 +25,8 @@ private slots:
     void recordedSequence();
     void releaseDelay();
     void recordingOwnsTheKeyboard();
+    void recordingEndsElsewhere_data();
+    void recordingEndsElsewhere();
 
 private:
     // Runs one step of a scenario:
@@ -210,6 +212,36 @@ void TestKeyWidget::recordingOwnsTheKeyboard()
     // Once idle the shortcut works again.
     QTest::keyClick(neighbour, Qt::Key_S, Qt::ControlModifier);
     QCOMPARE(fired.count(), 1);
+}
+
+void TestKeyWidget::recordingEndsElsewhere_data()
+{
+    QTest::addColumn<QString>("where");
+    QTest::newRow("a click outside the button") << "click";
+    QTest::newRow("another window of the program becomes active") << "window";
+}
+
+void TestKeyWidget::recordingEndsElsewhere()
+{
+    // The recording ends with the key from before it, and nothing is told.
+    QFETCH(QString, where);
+    widget->setKeySequence(portable("Ctrl+B"));
+    QSignalSpy changed(widget, &KKeySequenceWidget::keySequenceChanged);
+    QTest::mouseClick(button, Qt::LeftButton);
+    QTest::keyPress(button, Qt::Key_Control);
+    QVERIFY(widget->isRecording());
+    QWidget other;
+    if (where == QLatin1String("click")) {
+        QTest::mouseClick(neighbour, Qt::LeftButton);
+    } else {
+        other.show();
+        other.activateWindow();
+        QVERIFY(QTest::qWaitForWindowActive(&other));
+    }
+    QTRY_VERIFY(!widget->isRecording());
+    QCOMPARE(widget->keySequence(), portable("Ctrl+B"));
+    QCOMPARE(changed.count(), 0);
+    QCOMPARE(QWidget::keyboardGrabber(), nullptr);
 }
 
 ZEM_TEST_MAIN(TestKeyWidget)
