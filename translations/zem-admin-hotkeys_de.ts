@@ -40,6 +40,33 @@
     </message>
 </context>
 <context>
+    <name>HotkeysCheck</name>
+    <message>
+        <source>no [ShortCutKeys] section</source>
+        <translation>kein Abschnitt [ShortCutKeys]</translation>
+    </message>
+    <message>
+        <source>the key %1 cannot be read</source>
+        <translation>das Kürzel %1 ist nicht lesbar</translation>
+    </message>
+    <message>
+        <source>the key %1 does not count: line %2 binds the same key</source>
+        <translation>die Taste %1 zählt nicht: Zeile %2 belegt dieselbe Taste</translation>
+    </message>
+    <message>
+        <source>%1 is no function of the window manager</source>
+        <translation>%1 ist keine Funktion des Fenstermanagers</translation>
+    </message>
+    <message>
+        <source>the program of &quot;%1&quot; is not installed</source>
+        <translation>das Programm von „%1“ ist nicht installiert</translation>
+    </message>
+    <message>
+        <source>the key %1 alone takes a character from typing</source>
+        <translation>das Kürzel %1 allein nimmt dem Tippen ein Zeichen weg</translation>
+    </message>
+</context>
+<context>
     <name>HotkeysFile</name>
     <message>
         <source>No file name</source>
@@ -1253,20 +1280,8 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
         <translation>kein Abschnitt [ShortCutKeys]</translation>
     </message>
     <message>
-        <source>the key %1 cannot be read</source>
-        <translation>das Kürzel %1 ist nicht lesbar</translation>
-    </message>
-    <message>
         <source>%1 is no function of the window manager</source>
         <translation>%1 ist keine Funktion des Fenstermanagers</translation>
-    </message>
-    <message>
-        <source>the program of &quot;%1&quot; is not installed</source>
-        <translation>das Programm von „%1“ ist nicht installiert</translation>
-    </message>
-    <message>
-        <source>the key %1 alone takes a character from typing</source>
-        <translation>das Kürzel %1 allein nimmt dem Tippen ein Zeichen weg</translation>
     </message>
     <message>
         <source>%1 already does %2</source>
@@ -1291,10 +1306,6 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
     <message>
         <source>--file needs a file name</source>
         <translation>--file braucht einen Dateinamen</translation>
-    </message>
-    <message>
-        <source>the key %1 does not count: line %2 binds the same key</source>
-        <translation>die Taste %1 zählt nicht: Zeile %2 belegt dieselbe Taste</translation>
     </message>
     <message>
         <source>the argument %1 is not valid in the locale&apos;s encoding</source>

@@ -40,6 +40,33 @@
     </message>
 </context>
 <context>
+    <name>HotkeysCheck</name>
+    <message>
+        <source>no [ShortCutKeys] section</source>
+        <translation>sin sección [ShortCutKeys]</translation>
+    </message>
+    <message>
+        <source>the key %1 cannot be read</source>
+        <translation>el atajo %1 no se puede leer</translation>
+    </message>
+    <message>
+        <source>the key %1 does not count: line %2 binds the same key</source>
+        <translation>la tecla %1 no cuenta: la línea %2 asigna la misma tecla</translation>
+    </message>
+    <message>
+        <source>%1 is no function of the window manager</source>
+        <translation>%1 no es una función del gestor de ventanas</translation>
+    </message>
+    <message>
+        <source>the program of &quot;%1&quot; is not installed</source>
+        <translation>el programa de «%1» no está instalado</translation>
+    </message>
+    <message>
+        <source>the key %1 alone takes a character from typing</source>
+        <translation>el atajo %1 solo quita un carácter al escribir</translation>
+    </message>
+</context>
+<context>
     <name>HotkeysFile</name>
     <message>
         <source>No file name</source>
@@ -1253,20 +1280,8 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
         <translation>sin sección [ShortCutKeys]</translation>
     </message>
     <message>
-        <source>the key %1 cannot be read</source>
-        <translation>el atajo %1 no se puede leer</translation>
-    </message>
-    <message>
         <source>%1 is no function of the window manager</source>
         <translation>%1 no es una función del gestor de ventanas</translation>
-    </message>
-    <message>
-        <source>the program of &quot;%1&quot; is not installed</source>
-        <translation>el programa de «%1» no está instalado</translation>
-    </message>
-    <message>
-        <source>the key %1 alone takes a character from typing</source>
-        <translation>el atajo %1 solo quita un carácter al escribir</translation>
     </message>
     <message>
         <source>%1 already does %2</source>
@@ -1291,10 +1306,6 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
     <message>
         <source>--file needs a file name</source>
         <translation>--file necesita un nombre de archivo</translation>
-    </message>
-    <message>
-        <source>the key %1 does not count: line %2 binds the same key</source>
-        <translation>la tecla %1 no cuenta: la línea %2 asigna la misma tecla</translation>
     </message>
     <message>
         <source>the argument %1 is not valid in the locale&apos;s encoding</source>

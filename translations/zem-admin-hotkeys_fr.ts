@@ -40,6 +40,33 @@
     </message>
 </context>
 <context>
+    <name>HotkeysCheck</name>
+    <message>
+        <source>no [ShortCutKeys] section</source>
+        <translation>aucune section [ShortCutKeys]</translation>
+    </message>
+    <message>
+        <source>the key %1 cannot be read</source>
+        <translation>le raccourci %1 est illisible</translation>
+    </message>
+    <message>
+        <source>the key %1 does not count: line %2 binds the same key</source>
+        <translation>la touche %1 ne compte pas : la ligne %2 affecte la même touche</translation>
+    </message>
+    <message>
+        <source>%1 is no function of the window manager</source>
+        <translation>%1 n’est pas une fonction du gestionnaire de fenêtres</translation>
+    </message>
+    <message>
+        <source>the program of &quot;%1&quot; is not installed</source>
+        <translation>le programme de « %1 » n’est pas installé</translation>
+    </message>
+    <message>
+        <source>the key %1 alone takes a character from typing</source>
+        <translation>le raccourci %1 seul prend un caractère à la saisie</translation>
+    </message>
+</context>
+<context>
     <name>HotkeysFile</name>
     <message>
         <source>No file name</source>
@@ -1253,20 +1280,8 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
         <translation>aucune section [ShortCutKeys]</translation>
     </message>
     <message>
-        <source>the key %1 cannot be read</source>
-        <translation>le raccourci %1 est illisible</translation>
-    </message>
-    <message>
         <source>%1 is no function of the window manager</source>
         <translation>%1 n’est pas une fonction du gestionnaire de fenêtres</translation>
-    </message>
-    <message>
-        <source>the program of &quot;%1&quot; is not installed</source>
-        <translation>le programme de « %1 » n’est pas installé</translation>
-    </message>
-    <message>
-        <source>the key %1 alone takes a character from typing</source>
-        <translation>le raccourci %1 seul prend un caractère à la saisie</translation>
     </message>
     <message>
         <source>%1 already does %2</source>
@@ -1291,10 +1306,6 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
     <message>
         <source>--file needs a file name</source>
         <translation>--file demande un nom de fichier</translation>
-    </message>
-    <message>
-        <source>the key %1 does not count: line %2 binds the same key</source>
-        <translation>la touche %1 ne compte pas : la ligne %2 affecte la même touche</translation>
     </message>
     <message>
         <source>the argument %1 is not valid in the locale&apos;s encoding</source>

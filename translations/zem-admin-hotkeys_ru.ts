@@ -40,6 +40,33 @@
     </message>
 </context>
 <context>
+    <name>HotkeysCheck</name>
+    <message>
+        <source>no [ShortCutKeys] section</source>
+        <translation>нет раздела [ShortCutKeys]</translation>
+    </message>
+    <message>
+        <source>the key %1 cannot be read</source>
+        <translation>сочетание %1 не читается</translation>
+    </message>
+    <message>
+        <source>the key %1 does not count: line %2 binds the same key</source>
+        <translation>клавиша %1 не действует: строка %2 назначает ту же клавишу</translation>
+    </message>
+    <message>
+        <source>%1 is no function of the window manager</source>
+        <translation>%1 — не функция оконного менеджера</translation>
+    </message>
+    <message>
+        <source>the program of &quot;%1&quot; is not installed</source>
+        <translation>программа команды «%1» не установлена</translation>
+    </message>
+    <message>
+        <source>the key %1 alone takes a character from typing</source>
+        <translation>сочетание %1 без модификаторов отнимает символ у ввода</translation>
+    </message>
+</context>
+<context>
     <name>HotkeysFile</name>
     <message>
         <source>No file name</source>
@@ -1255,20 +1282,8 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
         <translation>нет раздела [ShortCutKeys]</translation>
     </message>
     <message>
-        <source>the key %1 cannot be read</source>
-        <translation>сочетание %1 не читается</translation>
-    </message>
-    <message>
         <source>%1 is no function of the window manager</source>
         <translation>%1 — не функция оконного менеджера</translation>
-    </message>
-    <message>
-        <source>the program of &quot;%1&quot; is not installed</source>
-        <translation>программа команды «%1» не установлена</translation>
-    </message>
-    <message>
-        <source>the key %1 alone takes a character from typing</source>
-        <translation>сочетание %1 без модификаторов отнимает символ у ввода</translation>
     </message>
     <message>
         <source>%1 already does %2</source>
@@ -1293,10 +1308,6 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
     <message>
         <source>--file needs a file name</source>
         <translation>для --file нужно имя файла</translation>
-    </message>
-    <message>
-        <source>the key %1 does not count: line %2 binds the same key</source>
-        <translation>клавиша %1 не действует: строка %2 назначает ту же клавишу</translation>
     </message>
     <message>
         <source>the argument %1 is not valid in the locale&apos;s encoding</source>

@@ -2,6 +2,7 @@
 
 #include "bindingfilter.h"
 #include "functioncatalogue.h"
+#include "hotkeyscheck.h"
 #include "hotkeysdocument.h"
 #include "hotkeysentries.h"
 #include "hotkeysfile.h"
@@ -17,8 +18,6 @@
 #include <QJsonDocument>
 #include <QJsonObject>
 #include <QKeySequence>
-#include <QProcess>
-#include <QStandardPaths>
 #include <QTextStream>
 
 #include <X11/Xlib.h>
@@ -216,94 +215,6 @@ int list(const Options& options, QTextStream& out, QTextStream& err)
     return 0;
 }
 
-struct Finding
-{
-    QString path;
-    int line;
-    bool error;
-    QString text;
-};
-
-bool programExists(const QString& command)
-{
-    // Large files run the same few programs thousands of times; each is looked up once.
-    static QHash<QString, bool> known;
-    const QString program = QProcess::splitCommand(command).value(0);
-    const auto it = known.constFind(program);
-    if (it != known.cend())
-        return *it;
-    bool exists = false;
-    if (program.contains(QLatin1Char('/'))) {
-        const QFileInfo info(program);
-        exists = info.isFile() && info.isExecutable();
-    } else if (!program.isEmpty()) {
-        exists = !QStandardPaths::findExecutable(program).isEmpty();
-    }
-    known.insert(program, exists);
-    return exists;
-}
-
-// A key of one printable character without Ctrl, Alt or Meta takes that character from typing.
-bool swallowsTyping(const QString& storedKey)
-{
-    const QKeySequence sequence = QKeySequence::fromString(storedKey, QKeySequence::PortableText);
-    if (sequence.count() != 1)
-        return false;
-    const int combined = sequence[0];
-    const int key = combined & ~int(Qt::KeyboardModifierMask);
-    const bool chord = combined & int(Qt::ControlModifier | Qt::AltModifier | Qt::MetaModifier);
-    return !chord && key < 0x01000000 && QChar::isPrint(uint(key));
-}
-
-void checkFile(const QString& path, QVector<Finding>& findings)
-{
-    QByteArray bytes;
-    QString reason;
-    HotkeysEntries file;
-    if (!readHotkeysFile(path, &bytes, &reason)) {
-        findings.append({path, 0, true, reason});
-        return;
-    }
-    if (!file.read(bytes)) {
-        findings.append({path, 0, true, ZemHotkeys::tr("no [ShortCutKeys] section")});
-        return;
-    }
-    const QVector<HotkeysLine>& lines = file.lines().lines();
-    // Lines of a key that another line of the same key overrides, and the line that counts.
-    QHash<int, int> overridden;
-    for (const KeyEntry& entry : file.entries()) {
-        for (int line : entry.others)
-            overridden.insert(line, entry.counting >= 0 ? lines.at(entry.counting).number : 0);
-    }
-    for (int i = 0; i < lines.size(); ++i) {
-        const HotkeysLine& line = lines.at(i);
-        if (line.kind != HotkeysLine::Entry || !file.lines().isHotkeysSection(line.section))
-            continue;
-        const QString key = printableText(QString::fromLocal8Bit(line.key));
-        const QString value = unquoted(QString::fromLocal8Bit(line.value));
-        const auto say = [&](bool error, const QString& text) {
-            findings.append({path, line.number, error, text});
-        };
-        bool readable = true;
-        const QString stored = fromFileKey(QString::fromLocal8Bit(line.key), &readable);
-        if (!readable)
-            say(true, ZemHotkeys::tr("the key %1 cannot be read").arg(key));
-        if (overridden.contains(i))
-            say(false, ZemHotkeys::tr("the key %1 does not count: line %2 binds the same key")
-                           .arg(key)
-                           .arg(overridden.value(i)));
-        if (value.startsWith(QLatin1String("ZEMWM_"))) {
-            if (!HotkeysModel::functionNames().contains(value))
-                say(true,
-                    ZemHotkeys::tr("%1 is no function of the window manager").arg(printableText(value)));
-        } else if (value != QLatin1String("Disable") && !programExists(value)) {
-            say(false, ZemHotkeys::tr("the program of \"%1\" is not installed").arg(printableText(value)));
-        }
-        if (readable && value != QLatin1String("Disable") && swallowsTyping(stored))
-            say(false, ZemHotkeys::tr("the key %1 alone takes a character from typing").arg(key));
-    }
-}
-
 int check(const Options& options, QTextStream& out)
 {
     QStringList files = options.words.mid(1);
@@ -311,7 +222,7 @@ int check(const Options& options, QTextStream& out)
         files << userHotkeysFilePath() << systemHotkeysFilePath();
     QVector<Finding> findings;
     for (const QString& file : qAsConst(files))
-        checkFile(file, findings);
+        findings += checkHotkeysFile(file);
     QJsonArray entries;
     for (const Finding& finding : qAsConst(findings)) {
         const QString severity = finding.error ? QStringLiteral("error") : QStringLiteral("warning");
@@ -319,6 +230,7 @@ int check(const Options& options, QTextStream& out)
             entries.append(QJsonObject{{"file", finding.path},
                                        {"line", finding.line},
                                        {"severity", severity},
+                                       {"code", finding.code},
                                        {"message", finding.text}});
         else
             out << printableText(finding.path) << ':' << finding.line << ": " << severity << ": "
