@@ -1,6 +1,7 @@
 #include "keysconfform.h"
 
 #include "bindingtree.h"
+#include "filterbar.h"
 #include "handbook.h"
 #include "hotkeysfile.h"
 #include "kkeysequencewidget.h"
@@ -22,6 +23,8 @@
 #include <QSessionManager>
 #include <QScreen>
 #include <QSettings>
+#include <QLabel>
+#include <QStatusBar>
 #include <QTimer>
 #include <QToolBar>
 #include <QTreeWidget>
@@ -60,7 +63,6 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     setCentralWidget(central);
     mainLayout = new QVBoxLayout(central);
 
-    createFilter(central);
     keysTree = new QTreeWidget(central);
     keysTree->setObjectName(QStringLiteral("keysTree"));
     keysTree->setSortingEnabled(false);
@@ -74,6 +76,16 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     mainLayout->addWidget(keysTree);
     bindingTree = std::make_unique<BindingTree>(keysTree, &model);
     bindingTree->setSourceTexts(userSource, systemSource);
+    filterBar = new FilterBar(keysTree, bindingTree.get(), &model, central);
+    mainLayout->insertWidget(0, filterBar);
+    statusBar()->addPermanentWidget(filterBar->countLabel());
+    connect(filterBar, &FilterBar::selectionHidden, this, [this] { itemSelected(nullptr); });
+    connect(filterBar, &FilterBar::found, this, [this](const QString& message) {
+        if (message.isEmpty())
+            statusBar()->clearMessage();
+        else
+            statusBar()->showMessage(message);
+    });
 
     keyGroupBox = new QGroupBox(tr("Choose a Key for the Selected Action"), central);
     keyGroupBox->setObjectName(QStringLiteral("keyGroupBox"));
@@ -336,6 +348,11 @@ void KeysConfForm::updateRevertAction()
 {
     revertAction->setEnabled(edited->isMerged() && currentFile == edited->path() &&
                              model.canRevert(bindingAt(targetRow())));
+}
+
+void KeysConfForm::applyFilter()
+{
+    filterBar->apply();
 }
 
 void KeysConfForm::edit(const QString& text, BindingId focus, const HotkeysModel& after)

@@ -10,6 +10,7 @@
 #include <memory>
 
 class BindingTree;
+class FilterBar;
 class KKeySequenceWidget;
 class QAction;
 class QTimer;
@@ -108,7 +109,6 @@ public slots:
     void commitData(QSessionManager& manager);
 
 protected:
-    bool eventFilter(QObject* watched, QEvent* event) override;
     void closeEvent(QCloseEvent* event) override;
     void contextMenuEvent(QContextMenuEvent* event) override;
 
@@ -122,9 +122,6 @@ private:
     void startAfresh();
     void updateRevertAction();
     void showInKeyWidget(const QKeySequence& seq);
-    void createFilter(QWidget* parent);
-    void findKey(const QKeySequence& seq);
-    void resetFindKey();
     // Loads currentFile; when it cannot be loaded, says so and makes previous current again.
     bool loadCurrentFileOr(const QString& previous);
     bool saveFileOrWarn();
@@ -178,12 +175,7 @@ private:
     QUndoStack* undoStack = nullptr;
     QAction* revertAction = nullptr;
     bool reassignChosen = false;
-    QLineEdit* filterEdit = nullptr;
-    KKeySequenceWidget* findKeyWidget = nullptr;
-    QLabel* filterStatus = nullptr;
-    QTimer* filterTimer = nullptr;
-    QList<bool> expandedBeforeFilter;
-    bool wasFiltering = false;
+    FilterBar* filterBar = nullptr;
 
     static QString userSource;
     static QString systemSource;
