@@ -126,8 +126,7 @@ void FilterBar::findKey(const QKeySequence& seq)
     apply();
     const Binding* holder = model->find(model->holderOf(key));
     if (!holder)
-        emit found(model->isDisabled(key) ? tr("%1 is disabled").arg(shown)
-                                                       : tr("%1 is free").arg(shown));
+        emit found(model->isDisabled(key) ? tr("%1 is disabled").arg(shown) : tr("%1 is free").arg(shown));
     else if (holder->source == BindingSource::System)
         emit found(tr("%1 is taken from the system file").arg(shown));
     else

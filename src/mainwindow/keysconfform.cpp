@@ -4,6 +4,7 @@
 #include "filterbar.h"
 #include "handbook.h"
 #include "hotkeysfile.h"
+#include "keypanel.h"
 #include "kkeysequencewidget.h"
 #include "modelcommand.h"
 #include "zemhelpmenu.h"
@@ -17,13 +18,13 @@
 #include <QHBoxLayout>
 #include <QHeaderView>
 #include <QIcon>
+#include <QLabel>
 #include <QMenu>
 #include <QMenuBar>
 #include <QRadioButton>
-#include <QSessionManager>
 #include <QScreen>
+#include <QSessionManager>
 #include <QSettings>
-#include <QLabel>
 #include <QStatusBar>
 #include <QTimer>
 #include <QToolBar>
@@ -87,25 +88,12 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
             statusBar()->showMessage(message);
     });
 
-    keyGroupBox = new QGroupBox(tr("Choose a Key for the Selected Action"), central);
-    keyGroupBox->setObjectName(QStringLiteral("keyGroupBox"));
-    keyGroupBox->setEnabled(false);
-    customKeyRadio = new QRadioButton(tr("Assign Key:"), keyGroupBox);
-    customKeyRadio->setObjectName(QStringLiteral("customKeyRadio"));
-    keyWidget = new KKeySequenceWidget(keyGroupBox);
-    keyWidget->setObjectName(QStringLiteral("keyWidget"));
-    noKeyRadio = new QRadioButton(tr("Clear Key"), keyGroupBox);
-    noKeyRadio->setObjectName(QStringLiteral("noKeyRadio"));
-    auto* radios = new QButtonGroup(this);
-    radios->addButton(customKeyRadio);
-    radios->addButton(noKeyRadio);
-
-    auto* keyLayout = new QHBoxLayout(keyGroupBox);
-    keyLayout->addWidget(customKeyRadio);
-    keyLayout->addWidget(keyWidget);
-    keyLayout->addWidget(noKeyRadio);
-    keyLayout->addStretch(1);
-    mainLayout->addWidget(keyGroupBox);
+    keyPanel = new KeyPanel(central);
+    keyGroupBox = keyPanel;
+    customKeyRadio = keyPanel->assignRadio();
+    keyWidget = keyPanel->recorder();
+    noKeyRadio = keyPanel->clearRadio();
+    mainLayout->addWidget(keyPanel);
 
     fileNewAction = makeAction(this, tr("&New file"), "document-new");
     fileOpenAction = makeAction(this, tr("&Open..."), "document-open");
@@ -253,12 +241,6 @@ void KeysConfForm::connectKeyWidget()
 {
     connect(keyWidget, &KKeySequenceWidget::keySequenceChanged, this, &KeysConfForm::fileChanged);
     connect(keyWidget, &KKeySequenceWidget::keySequenceChanged, this, &KeysConfForm::capturedKey);
-}
-
-void KeysConfForm::disconnectKeyWidget()
-{
-    disconnect(keyWidget, &KKeySequenceWidget::keySequenceChanged, this, &KeysConfForm::fileChanged);
-    disconnect(keyWidget, &KKeySequenceWidget::keySequenceChanged, this, &KeysConfForm::capturedKey);
 }
 
 bool KeysConfForm::init(QString filepath)

@@ -11,6 +11,7 @@
 
 class BindingTree;
 class FilterBar;
+class KeyPanel;
 class KKeySequenceWidget;
 class QAction;
 class QTimer;
@@ -121,12 +122,10 @@ private:
     // After New, Open and Restore: nothing to undo, and the file counts as edited.
     void startAfresh();
     void updateRevertAction();
-    void showInKeyWidget(const QKeySequence& seq);
     // Loads currentFile; when it cannot be loaded, says so and makes previous current again.
     bool loadCurrentFileOr(const QString& previous);
     bool saveFileOrWarn();
     void connectKeyWidget();
-    void disconnectKeyWidget();
     void restoreWindowState();
     void saveWindowState();
     // The row the command operations act on: the first selected row, else the current one.
@@ -176,6 +175,7 @@ private:
     QAction* revertAction = nullptr;
     bool reassignChosen = false;
     FilterBar* filterBar = nullptr;
+    KeyPanel* keyPanel = nullptr;
 
     static QString userSource;
     static QString systemSource;

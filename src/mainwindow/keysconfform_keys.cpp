@@ -1,6 +1,7 @@
 #include "keysconfform.h"
 
 #include "bindingtree.h"
+#include "keypanel.h"
 #include "kkeysequencewidget.h"
 
 #include <QGroupBox>
@@ -13,40 +14,11 @@
 
 void KeysConfForm::itemSelected(QTreeWidgetItem* selected)
 {
-    // Showing a row's key in the widget is no edit.
-    disconnectKeyWidget();
-
-    if (!selected || selected == commandGroupItem || selected->text(2).isEmpty()) {
-        keyGroupBox->setEnabled(false);
-        connectKeyWidget();
-        return;
-    }
-
-    keyGroupBox->setEnabled(true);
-    const QString key = itemKey(selected);
-    if (key.isEmpty()) {
-        noKeyRadio->setChecked(true);
-        keyWidget->setEnabled(false);
-        keyWidget->clearKeySequence();
-    } else {
-        customKeyRadio->setChecked(true);
-        keyWidget->setEnabled(true);
-        // Keys that loading could not turn into a key sequence are shown as they were read.
-        const QKeySequence sequence = QKeySequence::fromString(key, QKeySequence::NativeText);
-        const QString portable = sequence.toString(QKeySequence::PortableText);
-        const bool danglingPlus =
-            portable.endsWith(QLatin1Char('+')) && !portable.endsWith(QLatin1String("++"));
-        // Qt parses a name it does not know as Key_unknown instead of failing, so a sequence
-        // holding one counts as empty too.
-        bool unknownKey = false;
-        for (int i = 0; i < sequence.count(); ++i)
-            unknownKey |= (sequence[i] & ~int(Qt::KeyboardModifierMask)) == Qt::Key_unknown;
-        if (key.startsWith(QLatin1Char('#')) || danglingPlus || sequence.isEmpty() || unknownKey)
-            keyWidget->showKeyText(key);
-        else
-            keyWidget->setKeySequence(sequence, KKeySequenceWidget::NoValidate);
-    }
-    connectKeyWidget();
+    const Binding* binding = model.find(bindingAt(selected));
+    if (binding)
+        keyPanel->showKey(binding->key);
+    else
+        keyPanel->showNoRow();
 }
 
 void KeysConfForm::opt_customkey_checked()
@@ -58,14 +30,6 @@ void KeysConfForm::opt_customkey_checked()
 void KeysConfForm::capturedKey(const QKeySequence& seq)
 {
     setKey(seq);
-}
-
-void KeysConfForm::showInKeyWidget(const QKeySequence& seq)
-{
-    // Telling the widget what it shows is no new recording: were it to report a change, the
-    // edit would be made, and recorded for undo, a second time.
-    const QSignalBlocker quiet(keyWidget);
-    keyWidget->setKeySequence(seq, KKeySequenceWidget::NoValidate);
 }
 
 void KeysConfForm::setKey(const QKeySequence& seq)
@@ -86,13 +50,13 @@ void KeysConfForm::setKey(const QKeySequence& seq)
         const BindingId holder = model.holderOf(key, id);
         const QString holderText = bindingTree->rowOf(holder)->text(0);
         after.reassign(holder, id);
-        showInKeyWidget(seq);
+        keyPanel->showRecorded(seq);
         edit(tr("Reassign %1 from %2 to %3").arg(shown, holderText, keysTree->currentItem()->text(0)), id,
              after);
         return;
     }
     after.setKey(id, key);
-    showInKeyWidget(seq);
+    keyPanel->showRecorded(seq);
     edit(tr("Assign %1 to %2").arg(shown, keysTree->currentItem()->text(0)), id, after);
 }
 
