@@ -167,7 +167,8 @@ bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBy
                     continue;
                 }
                 Binding& first = fresh.functionRows[function].first();
-                if (first.key.isEmpty()) {
+                // The first row is taken by the first entry read, keyless or not.
+                if (first.source == BindingSource::Unset) {
                     first.key = key;
                     first.fileKey = fileKey;
                     first.source = source;
