@@ -9,6 +9,45 @@
     </message>
 </context>
 <context>
+    <name>FilterBar</name>
+    <message>
+        <source>Filter by action, function, command or key</source>
+        <translation>Nach Aktion, Funktion, Befehl oder Kürzel filtern</translation>
+    </message>
+    <message>
+        <source>Filter</source>
+        <translation>Filter</translation>
+    </message>
+    <message>
+        <source>Press a key combination to find what it does</source>
+        <translation>Eine Tastenkombination drücken, um zu sehen, was sie tut</translation>
+    </message>
+    <message>
+        <source>Find key</source>
+        <translation>Kürzel suchen</translation>
+    </message>
+    <message numerus="yes">
+        <source>%1 of %n bindings</source>
+        <extracomment>Shown while a filter is active, for example &quot;3 of 186 bindings&quot;.</extracomment>
+        <translation>
+            <numerusform>%1 von %n Kürzel</numerusform>
+            <numerusform>%1 von %n Kürzeln</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1 is disabled</source>
+        <translation>%1 ist abgeschaltet</translation>
+    </message>
+    <message>
+        <source>%1 is free</source>
+        <translation>%1 ist frei</translation>
+    </message>
+    <message>
+        <source>%1 is taken from the system file</source>
+        <translation>%1 stammt aus der Systemdatei</translation>
+    </message>
+</context>
+<context>
     <name>Handbook</name>
     <message>
         <source>Zem hotkeys editor Handbook</source>
@@ -150,6 +189,10 @@
     <message>
         <source>The key you just pressed is not supported by Qt.</source>
         <translation>Die eben gedrückte Taste wird von Qt nicht unterstützt.</translation>
+    </message>
+    <message>
+        <source>Clear the key</source>
+        <translation>Kürzel entfernen</translation>
     </message>
 </context>
 <context>
@@ -864,6 +907,7 @@
     </message>
     <message>
         <source>Choose a Key for the Selected Action</source>
+        <extracomment>The title of the key panel below the tree.</extracomment>
         <translation>Kürzel für die gewählte Aktion</translation>
     </message>
     <message>
@@ -1054,38 +1098,6 @@ Nach einem Neustart verwendet zem-wm „%2“.</translation>
         <translation>Der Fenstermanager konnte nicht angewiesen werden, %1 neu zu laden.</translation>
     </message>
     <message>
-        <source>Filter by action, function, command or key</source>
-        <translation>Nach Aktion, Funktion, Befehl oder Kürzel filtern</translation>
-    </message>
-    <message>
-        <source>Press a key combination to find what it does</source>
-        <translation>Eine Tastenkombination drücken, um zu sehen, was sie tut</translation>
-    </message>
-    <message>
-        <source>Find key</source>
-        <translation>Kürzel suchen</translation>
-    </message>
-    <message numerus="yes">
-        <source>%1 of %n bindings</source>
-        <extracomment>Shown while a filter is active, for example &quot;3 of 186 bindings&quot;.</extracomment>
-        <translation>
-            <numerusform>%1 von %n Kürzel</numerusform>
-            <numerusform>%1 von %n Kürzeln</numerusform>
-        </translation>
-    </message>
-    <message>
-        <source>%1 is disabled</source>
-        <translation>%1 ist abgeschaltet</translation>
-    </message>
-    <message>
-        <source>%1 is free</source>
-        <translation>%1 ist frei</translation>
-    </message>
-    <message>
-        <source>%1 is taken from the system file</source>
-        <translation>%1 stammt aus der Systemdatei</translation>
-    </message>
-    <message>
         <source>Reassign %1 from %2 to %3</source>
         <translation>%1 von %2 neu an %3 zuweisen</translation>
     </message>
@@ -1164,6 +1176,16 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
     <message>
         <source>The window manager was told to reload %1</source>
         <translation>Der Fenstermanager wurde angewiesen, %1 neu zu laden</translation>
+    </message>
+    <message>
+        <source>Key of the selected action</source>
+        <extracomment>Spoken by screen readers for the key recorder of the key panel.</extracomment>
+        <translation>Kürzel der gewählten Aktion</translation>
+    </message>
+    <message>
+        <source>Bindings</source>
+        <extracomment>Spoken by screen readers for the tree of bindings.</extracomment>
+        <translation>Belegungen</translation>
     </message>
 </context>
 <context>

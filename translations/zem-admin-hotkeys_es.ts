@@ -9,6 +9,45 @@
     </message>
 </context>
 <context>
+    <name>FilterBar</name>
+    <message>
+        <source>Filter by action, function, command or key</source>
+        <translation>Filtrar por acción, función, orden o atajo</translation>
+    </message>
+    <message>
+        <source>Filter</source>
+        <translation>Filtrar</translation>
+    </message>
+    <message>
+        <source>Press a key combination to find what it does</source>
+        <translation>Pulse una combinación de teclas para ver qué hace</translation>
+    </message>
+    <message>
+        <source>Find key</source>
+        <translation>Buscar atajo</translation>
+    </message>
+    <message numerus="yes">
+        <source>%1 of %n bindings</source>
+        <extracomment>Shown while a filter is active, for example &quot;3 of 186 bindings&quot;.</extracomment>
+        <translation>
+            <numerusform>%1 de %n atajo</numerusform>
+            <numerusform>%1 de %n atajos</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1 is disabled</source>
+        <translation>%1 está desactivado</translation>
+    </message>
+    <message>
+        <source>%1 is free</source>
+        <translation>%1 está libre</translation>
+    </message>
+    <message>
+        <source>%1 is taken from the system file</source>
+        <translation>%1 procede del archivo del sistema</translation>
+    </message>
+</context>
+<context>
     <name>Handbook</name>
     <message>
         <source>Zem hotkeys editor Handbook</source>
@@ -150,6 +189,10 @@
     <message>
         <source>The key you just pressed is not supported by Qt.</source>
         <translation>La tecla que acaba de pulsar no es compatible con Qt.</translation>
+    </message>
+    <message>
+        <source>Clear the key</source>
+        <translation>Borrar la tecla</translation>
     </message>
 </context>
 <context>
@@ -864,6 +907,7 @@
     </message>
     <message>
         <source>Choose a Key for the Selected Action</source>
+        <extracomment>The title of the key panel below the tree.</extracomment>
         <translation>Elegir un atajo para la acción seleccionada</translation>
     </message>
     <message>
@@ -1054,38 +1098,6 @@ Tras reiniciar, zem-wm usará «%2».</translation>
         <translation>No se pudo indicar al gestor de ventanas que recargue %1.</translation>
     </message>
     <message>
-        <source>Filter by action, function, command or key</source>
-        <translation>Filtrar por acción, función, orden o atajo</translation>
-    </message>
-    <message>
-        <source>Press a key combination to find what it does</source>
-        <translation>Pulse una combinación de teclas para ver qué hace</translation>
-    </message>
-    <message>
-        <source>Find key</source>
-        <translation>Buscar atajo</translation>
-    </message>
-    <message numerus="yes">
-        <source>%1 of %n bindings</source>
-        <extracomment>Shown while a filter is active, for example &quot;3 of 186 bindings&quot;.</extracomment>
-        <translation>
-            <numerusform>%1 de %n atajo</numerusform>
-            <numerusform>%1 de %n atajos</numerusform>
-        </translation>
-    </message>
-    <message>
-        <source>%1 is disabled</source>
-        <translation>%1 está desactivado</translation>
-    </message>
-    <message>
-        <source>%1 is free</source>
-        <translation>%1 está libre</translation>
-    </message>
-    <message>
-        <source>%1 is taken from the system file</source>
-        <translation>%1 procede del archivo del sistema</translation>
-    </message>
-    <message>
         <source>Reassign %1 from %2 to %3</source>
         <translation>Reasignar %1 de %2 a %3</translation>
     </message>
@@ -1164,6 +1176,16 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
     <message>
         <source>The window manager was told to reload %1</source>
         <translation>Se pidió al gestor de ventanas que vuelva a cargar %1</translation>
+    </message>
+    <message>
+        <source>Key of the selected action</source>
+        <extracomment>Spoken by screen readers for the key recorder of the key panel.</extracomment>
+        <translation>Tecla de la acción elegida</translation>
+    </message>
+    <message>
+        <source>Bindings</source>
+        <extracomment>Spoken by screen readers for the tree of bindings.</extracomment>
+        <translation>Atajos</translation>
     </message>
 </context>
 <context>

@@ -9,6 +9,45 @@
     </message>
 </context>
 <context>
+    <name>FilterBar</name>
+    <message>
+        <source>Filter by action, function, command or key</source>
+        <translation>Filtrer par action, fonction, commande ou raccourci</translation>
+    </message>
+    <message>
+        <source>Filter</source>
+        <translation>Filtrer</translation>
+    </message>
+    <message>
+        <source>Press a key combination to find what it does</source>
+        <translation>Appuyez sur une combinaison de touches pour savoir ce qu’elle fait</translation>
+    </message>
+    <message>
+        <source>Find key</source>
+        <translation>Chercher un raccourci</translation>
+    </message>
+    <message numerus="yes">
+        <source>%1 of %n bindings</source>
+        <extracomment>Shown while a filter is active, for example &quot;3 of 186 bindings&quot;.</extracomment>
+        <translation>
+            <numerusform>%1 sur %n raccourci</numerusform>
+            <numerusform>%1 sur %n raccourcis</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1 is disabled</source>
+        <translation>%1 est désactivé</translation>
+    </message>
+    <message>
+        <source>%1 is free</source>
+        <translation>%1 est libre</translation>
+    </message>
+    <message>
+        <source>%1 is taken from the system file</source>
+        <translation>%1 vient du fichier du système</translation>
+    </message>
+</context>
+<context>
     <name>Handbook</name>
     <message>
         <source>Zem hotkeys editor Handbook</source>
@@ -150,6 +189,10 @@
     <message>
         <source>The key you just pressed is not supported by Qt.</source>
         <translation>La touche que vous venez de presser n’est pas prise en charge par Qt.</translation>
+    </message>
+    <message>
+        <source>Clear the key</source>
+        <translation>Effacer la touche</translation>
     </message>
 </context>
 <context>
@@ -864,6 +907,7 @@
     </message>
     <message>
         <source>Choose a Key for the Selected Action</source>
+        <extracomment>The title of the key panel below the tree.</extracomment>
         <translation>Choisir un raccourci pour l’action sélectionnée</translation>
     </message>
     <message>
@@ -1054,38 +1098,6 @@ Après un redémarrage, zem-wm utilisera « %2 ».</translation>
         <translation>Le gestionnaire de fenêtres n’a pas pu être invité à recharger %1.</translation>
     </message>
     <message>
-        <source>Filter by action, function, command or key</source>
-        <translation>Filtrer par action, fonction, commande ou raccourci</translation>
-    </message>
-    <message>
-        <source>Press a key combination to find what it does</source>
-        <translation>Appuyez sur une combinaison de touches pour savoir ce qu’elle fait</translation>
-    </message>
-    <message>
-        <source>Find key</source>
-        <translation>Chercher un raccourci</translation>
-    </message>
-    <message numerus="yes">
-        <source>%1 of %n bindings</source>
-        <extracomment>Shown while a filter is active, for example &quot;3 of 186 bindings&quot;.</extracomment>
-        <translation>
-            <numerusform>%1 sur %n raccourci</numerusform>
-            <numerusform>%1 sur %n raccourcis</numerusform>
-        </translation>
-    </message>
-    <message>
-        <source>%1 is disabled</source>
-        <translation>%1 est désactivé</translation>
-    </message>
-    <message>
-        <source>%1 is free</source>
-        <translation>%1 est libre</translation>
-    </message>
-    <message>
-        <source>%1 is taken from the system file</source>
-        <translation>%1 vient du fichier du système</translation>
-    </message>
-    <message>
         <source>Reassign %1 from %2 to %3</source>
         <translation>Réattribuer %1 de %2 à %3</translation>
     </message>
@@ -1164,6 +1176,16 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
     <message>
         <source>The window manager was told to reload %1</source>
         <translation>Le gestionnaire de fenêtres a été prié de relire %1</translation>
+    </message>
+    <message>
+        <source>Key of the selected action</source>
+        <extracomment>Spoken by screen readers for the key recorder of the key panel.</extracomment>
+        <translation>Touche de l&apos;action choisie</translation>
+    </message>
+    <message>
+        <source>Bindings</source>
+        <extracomment>Spoken by screen readers for the tree of bindings.</extracomment>
+        <translation>Raccourcis</translation>
     </message>
 </context>
 <context>

@@ -9,6 +9,46 @@
     </message>
 </context>
 <context>
+    <name>FilterBar</name>
+    <message>
+        <source>Filter by action, function, command or key</source>
+        <translation>Фильтр по действию, функции, команде или сочетанию</translation>
+    </message>
+    <message>
+        <source>Filter</source>
+        <translation>Фильтр</translation>
+    </message>
+    <message>
+        <source>Press a key combination to find what it does</source>
+        <translation>Нажмите сочетание клавиш, чтобы узнать, что оно делает</translation>
+    </message>
+    <message>
+        <source>Find key</source>
+        <translation>Найти сочетание</translation>
+    </message>
+    <message numerus="yes">
+        <source>%1 of %n bindings</source>
+        <extracomment>Shown while a filter is active, for example &quot;3 of 186 bindings&quot;.</extracomment>
+        <translation>
+            <numerusform>%1 из %n сочетания</numerusform>
+            <numerusform>%1 из %n сочетаний</numerusform>
+            <numerusform>%1 из %n сочетаний</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1 is disabled</source>
+        <translation>%1 отключено</translation>
+    </message>
+    <message>
+        <source>%1 is free</source>
+        <translation>%1 свободно</translation>
+    </message>
+    <message>
+        <source>%1 is taken from the system file</source>
+        <translation>%1 взято из системного файла</translation>
+    </message>
+</context>
+<context>
     <name>Handbook</name>
     <message>
         <source>Zem hotkeys editor Handbook</source>
@@ -150,6 +190,10 @@
     <message>
         <source>The key you just pressed is not supported by Qt.</source>
         <translation>Только что нажатая клавиша не поддерживается Qt.</translation>
+    </message>
+    <message>
+        <source>Clear the key</source>
+        <translation>Очистить клавишу</translation>
     </message>
 </context>
 <context>
@@ -864,6 +908,7 @@
     </message>
     <message>
         <source>Choose a Key for the Selected Action</source>
+        <extracomment>The title of the key panel below the tree.</extracomment>
         <translation>Выберите сочетание для выбранного действия</translation>
     </message>
     <message>
@@ -1055,39 +1100,6 @@ After restart zem-wm will use &quot;%2&quot;.</source>
         <translation>Не удалось попросить оконный менеджер перечитать %1.</translation>
     </message>
     <message>
-        <source>Filter by action, function, command or key</source>
-        <translation>Фильтр по действию, функции, команде или сочетанию</translation>
-    </message>
-    <message>
-        <source>Press a key combination to find what it does</source>
-        <translation>Нажмите сочетание клавиш, чтобы узнать, что оно делает</translation>
-    </message>
-    <message>
-        <source>Find key</source>
-        <translation>Найти сочетание</translation>
-    </message>
-    <message numerus="yes">
-        <source>%1 of %n bindings</source>
-        <extracomment>Shown while a filter is active, for example &quot;3 of 186 bindings&quot;.</extracomment>
-        <translation>
-            <numerusform>%1 из %n сочетания</numerusform>
-            <numerusform>%1 из %n сочетаний</numerusform>
-            <numerusform>%1 из %n сочетаний</numerusform>
-        </translation>
-    </message>
-    <message>
-        <source>%1 is disabled</source>
-        <translation>%1 отключено</translation>
-    </message>
-    <message>
-        <source>%1 is free</source>
-        <translation>%1 свободно</translation>
-    </message>
-    <message>
-        <source>%1 is taken from the system file</source>
-        <translation>%1 взято из системного файла</translation>
-    </message>
-    <message>
         <source>Reassign %1 from %2 to %3</source>
         <translation>Переназначить %1 с «%2» на «%3»</translation>
     </message>
@@ -1166,6 +1178,16 @@ Overwrite %2 with your edits, reload both and drop them, or cancel?</source>
     <message>
         <source>The window manager was told to reload %1</source>
         <translation>Оконному менеджеру сказано перечитать %1</translation>
+    </message>
+    <message>
+        <source>Key of the selected action</source>
+        <extracomment>Spoken by screen readers for the key recorder of the key panel.</extracomment>
+        <translation>Клавиша выбранного действия</translation>
+    </message>
+    <message>
+        <source>Bindings</source>
+        <extracomment>Spoken by screen readers for the tree of bindings.</extracomment>
+        <translation>Назначения</translation>
     </message>
 </context>
 <context>

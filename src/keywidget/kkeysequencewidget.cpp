@@ -29,6 +29,9 @@ void KKeySequenceWidgetPrivate::setup()
     clearSequenceButton = new QToolButton(owner);
     clearSequenceButton->setObjectName(QStringLiteral("clearSequenceButton"));
     clearSequenceButton->setIcon(QIcon::fromTheme(QStringLiteral("edit-delete")));
+    // An icon alone says nothing to a screen reader or to a user who does not know it.
+    clearSequenceButton->setToolTip(KKeySequenceButton::tr("Clear the key"));
+    clearSequenceButton->setAccessibleName(KKeySequenceButton::tr("Clear the key"));
     layout->addWidget(clearSequenceButton);
 
     QObject::connect(recordButton, &QPushButton::clicked, owner, &KKeySequenceWidget::captureKeySequence);

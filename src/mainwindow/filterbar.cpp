@@ -24,11 +24,13 @@ FilterBar::FilterBar(QTreeWidget* tree, BindingTree* rows, const HotkeysModel* m
     edit->setClearButtonEnabled(true);
     edit->setPlaceholderText(tr("Filter by action, function, command or key"));
     edit->installEventFilter(this);
+    edit->setAccessibleName(tr("Filter"));
     // The editor's own recorder, showing what it is for while idle.
     findKeyWidget = new KKeySequenceWidget(this);
     findKeyWidget->setObjectName(QStringLiteral("findKeyWidget"));
     findKeyWidget->setMultiKeyShortcutsAllowed(false);
     findKeyWidget->setToolTip(tr("Press a key combination to find what it does"));
+    findKeyWidget->setAccessibleName(tr("Find key"));
     if (auto* clear = findKeyWidget->findChild<QToolButton*>(QStringLiteral("clearSequenceButton")))
         clear->hide();
     resetFindKey();

@@ -14,13 +14,14 @@ KeyPanel::KeyPanel(QWidget* parent) : QGroupBox(parent)
     //: The title of the key panel below the tree.
     setTitle(QCoreApplication::translate("KeysConfForm", "Choose a Key for the Selected Action"));
     setObjectName(QStringLiteral("keyGroupBox"));
-    setEnabled(false);
     assign = new QRadioButton(QCoreApplication::translate("KeysConfForm", "Assign Key:"), this);
     assign->setObjectName(QStringLiteral("customKeyRadio"));
     keys = new KKeySequenceWidget(this);
     keys->setObjectName(QStringLiteral("keyWidget"));
     clear = new QRadioButton(QCoreApplication::translate("KeysConfForm", "Clear Key"), this);
     clear->setObjectName(QStringLiteral("noKeyRadio"));
+    //: Spoken by screen readers for the key recorder of the key panel.
+    keys->setAccessibleName(QCoreApplication::translate("KeysConfForm", "Key of the selected action"));
     auto* radios = new QButtonGroup(this);
     radios->addButton(assign);
     radios->addButton(clear);
@@ -30,6 +31,9 @@ KeyPanel::KeyPanel(QWidget* parent) : QGroupBox(parent)
     layout->addWidget(keys);
     layout->addWidget(clear);
     layout->addStretch(1);
+    // Off until a row is chosen; only now, as Qt gives a widget made inside a disabled parent
+    // no accessible role of its own, and screen readers would not know the buttons.
+    setEnabled(false);
 }
 
 void KeyPanel::showNoRow()

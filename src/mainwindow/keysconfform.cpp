@@ -66,6 +66,8 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
 
     keysTree = new QTreeWidget(central);
     keysTree->setObjectName(QStringLiteral("keysTree"));
+    //: Spoken by screen readers for the tree of bindings.
+    keysTree->setAccessibleName(tr("Bindings"));
     keysTree->setSortingEnabled(false);
     keysTree->setHeaderLabels({tr("Action"), tr("Current Key"), tr("zem-wm function"), tr("Source")});
     // The tree takes the room there is and scrolls, so that the window fits small screens.
