@@ -211,3 +211,16 @@ QVector<WmFunctionEntry> buildWmFunctionTable(bool translated)
                       raw.code});
     return table;
 }
+
+const QStringList& catalogueFunctionNames()
+{
+    static const QStringList names = [] {
+        QStringList result;
+        for (const WmFunctionEntry& entry : buildWmFunctionTable(false)) {
+            if (entry.code != 0 && entry.keyName)
+                result << QString::fromLatin1(entry.keyName);
+        }
+        return result;
+    }();
+    return names;
+}

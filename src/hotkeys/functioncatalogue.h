@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QString>
+#include <QStringList>
 #include <QVector>
 
 // One line of the window manager's function catalogue: a group title (no key name, code 0) or
@@ -15,3 +16,6 @@ struct WmFunctionEntry
 // The catalogue in its fixed order, each group entry followed by its functions, with the texts
 // translated for the current language.
 QVector<WmFunctionEntry> buildWmFunctionTable(bool translated = true);
+
+// The names of the catalogue's functions, in its order (a function's index in the catalogue).
+const QStringList& catalogueFunctionNames();

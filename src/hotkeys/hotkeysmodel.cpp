@@ -82,15 +82,7 @@ HotkeysModel::HotkeysModel() : functionRows(functionNames().size()), base(emptyF
 
 const QStringList& HotkeysModel::functionNames()
 {
-    static const QStringList names = [] {
-        QStringList result;
-        for (const WmFunctionEntry& entry : buildWmFunctionTable()) {
-            if (entry.code != 0 && entry.keyName)
-                result << QString::fromLatin1(entry.keyName);
-        }
-        return result;
-    }();
-    return names;
+    return catalogueFunctionNames();
 }
 
 bool HotkeysModel::load(const QString& path, const QString& systemPath, QString* failedPath, QString* reason)

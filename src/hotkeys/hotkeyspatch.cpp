@@ -1,7 +1,7 @@
 #include "hotkeyspatch.h"
 
 #include "hotkeysentries.h"
-#include "hotkeysmodel.h"
+#include "functioncatalogue.h"
 #include "keyforms.h"
 
 #include <algorithm>
@@ -30,11 +30,11 @@ HotkeysPatch::HotkeysPatch(const HotkeysEntries& file, const QVector<QByteArray>
 int HotkeysPatch::rankOf(const QByteArray& value)
 {
     const QString action = unquoted(QString::fromLocal8Bit(value));
-    const int functions = HotkeysModel::functionNames().size();
+    const int functions = catalogueFunctionNames().size();
     if (action == QLatin1String("Disable"))
         return functions + 1;
     if (action.startsWith(QLatin1String("ZEMWM_")))
-        return HotkeysModel::functionNames().indexOf(action);
+        return catalogueFunctionNames().indexOf(action);
     return functions;
 }
 
