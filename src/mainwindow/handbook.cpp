@@ -23,8 +23,9 @@ Handbook::Handbook(QWidget* parent) : QDialog(parent)
            "and leaves the other without a key. <b>Clear Key</b> takes the key away. A system key "
            "you clear or change is written into your file as <i>Disable</i>, which switches the "
            "system binding of that key off. <b>Revert to System Binding</b> in the Edit menu gives "
-           "a function back the keys the system file gives it. Every edit can be undone and redone "
-           "(Ctrl+Z, Ctrl+Shift+Z).</p>") +
+           "a function or a command back what the system file gives it, and a key that Reassign "
+           "took goes back to the row it came from. Every edit can be undone and redone "
+           "(Ctrl+Z, Ctrl+Shift+Z), wherever the focus is.</p>") +
         tr("<h3>Finding</h3>"
            "<p>Type into the field above the tree (Ctrl+F) to see only the rows whose action, "
            "function, command or key holds the text; a key may be typed as Ctrl+Alt+T or "
@@ -36,10 +37,12 @@ Handbook::Handbook(QWidget* parent) : QDialog(parent)
            "<b>Clone</b> gives a function or a command a further row for another key; <b>Edit</b> "
            "and <b>Delete</b> change or remove a command.</p>") +
         tr("<h3>Save and Apply</h3>"
-           "<p><b>Save</b> writes your hotkeys file; entries you did not edit stay as they were, "
-           "and a file that cannot be written whole is left untouched. <b>Apply</b> saves and tells "
-           "the running window manager to read the file again. <b>Restore</b> replaces your file "
-           "with the system one and keeps the old one beside it as keyshortcutrc~.</p>") +
+           "<p><b>Save</b> (Ctrl+S) writes your hotkeys file; only the lines of the keys you edited "
+           "change, and a file that cannot be written whole is left untouched. <b>Apply</b> "
+           "(Ctrl+Return) saves and tells the running window manager to read the file again; a file "
+           "saved but not yet applied can still be applied. When another program changed the file "
+           "since it was loaded, you are asked before it is overwritten. <b>Restore</b> replaces "
+           "your file with the system one and keeps the old one beside it as keyshortcutrc~.</p>") +
         tr("<h3>Files</h3>"
            "<p>Your hotkeys file is keyshortcutrc in ~/.config/zem (or $XDG_CONFIG_HOME/zem); the "
            "system one is in the zem directory of the system configuration, /etc/zem for most "
