@@ -225,7 +225,8 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     connect(cloneCommandAction, &QAction::triggered, this, &KeysConfForm::cloneCommand);
     connect(revertAction, &QAction::triggered, this, &KeysConfForm::revertToSystemBinding);
     connect(undoStack, &QUndoStack::indexChanged, this, &KeysConfForm::fileChanged);
-    connect(edited, &EditedFile::changedOnDisk, this, &KeysConfForm::filesChangedOnDisk);
+    files = new FileCommands(this, edited, undoStack, this);
+    connect(edited, &EditedFile::changedOnDisk, files, &FileCommands::filesChangedOnDisk);
     connect(edited, &EditedFile::bindingsChanged, this, &KeysConfForm::followBindings);
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "editedfile.h"
+#include "filecommands.h"
 #include "hotkeysmodel.h"
 
 #include <QMainWindow>
@@ -34,7 +35,7 @@ class QVBoxLayout;
 // their keys, the key panel below it, and the file commands. The bindings themselves live in a
 // HotkeysModel; the tree is a view of it. There is one window per process, and its editing
 // state is class-wide.
-class KeysConfForm : public QMainWindow
+class KeysConfForm : public QMainWindow, private FileCommands::Window
 {
     Q_OBJECT
     Q_DISABLE_COPY(KeysConfForm)
@@ -51,12 +52,12 @@ public:
     // Reads a hotkeys file (merged with the system one for the user's file) into the tree;
     // false, with nothing changed, when it cannot be read: loadFailure() then says which file
     // failed and why.
-    bool loadFile(const QString& path);
-    QString loadFailure() const;
+    bool loadFile(const QString& path) override;
+    QString loadFailure() const override;
     // Writes the bindings to the current file; true when there was nothing to write. A failure
     // leaves the file as it was, and saveFailure() gives the reason.
     bool saveFile();
-    QString saveFailure() const { return saveError; }
+    QString saveFailure() const;
     void fillFunctionTree();
     void updateTitle();
 
@@ -79,7 +80,7 @@ public slots:
     virtual void deleteCommand();
     virtual void editCommand();
     virtual void fileApply();
-    virtual void fileChanged();
+    void fileChanged() override;
     virtual void fileClose();
     virtual void fileNew();
     virtual void fileOpen();
@@ -119,27 +120,22 @@ private:
     // and the tree follows, with the row the edit is about made current.
     void edit(const QString& text, BindingId focus, const HotkeysModel& after);
     void followBindings(const HotkeysModel& before, BindingId focus);
-    // After New, Open and Restore: nothing to undo, and the file counts as edited.
-    void startAfresh();
     void updateRevertAction();
-    // Loads currentFile; when it cannot be loaded, says so and makes previous current again.
-    bool loadCurrentFileOr(const QString& previous);
-    bool saveFileOrWarn();
     void connectKeyWidget();
     void restoreWindowState();
     void saveWindowState();
     // The row the command operations act on: the first selected row, else the current one.
     QTreeWidgetItem* targetRow() const;
     BindingId bindingAt(const QTreeWidgetItem* row) const;
-    void filesChangedOnDisk(EditedFile::Change change);
-    void reloadKeepingSelection();
-    // Before a save: false when the file changed on disk and the user chose not to overwrite it
-    // (Reload loads it as it is now).
-    bool mayOverwrite(EditedFile::Change change);
-    // Copies a file's bytes through the same safe write as saving; says so when it fails.
-    bool copyFile(const QString& from, const QString& to);
-    // Keeps the file as it is beside it, with "~" added to its name; says so when it cannot.
-    bool keepBackup(const QString& path);
+    // What the file commands ask of the window.
+    QWidget* questionParent() override;
+    QString currentPath() const override;
+    void setCurrentPath(const QString& path) override;
+    QString startedWith() const override;
+    bool hasUnsavedEdits() const override;
+    void bindingsWritten() override;
+    void reloadKeepingSelection() override;
+    void tell(const QString& message) override;
 
     QTreeWidget* keysTree = nullptr;
     QGroupBox* keyGroupBox = nullptr;
@@ -165,12 +161,7 @@ private:
     EditedFile* edited;
     HotkeysModel& model;
     std::unique_ptr<BindingTree> bindingTree;
-    QString saveError;
-    EditedFile::SaveResult lastSave = EditedFile::SaveResult::Saved;
-    // A save, or a file chosen, since the window manager was last told to read the file.
-    bool unapplied = false;
-    // What was on disk when the user agreed to overwrite it.
-    QByteArray acceptedDiskState;
+    FileCommands* files = nullptr;
     QUndoStack* undoStack = nullptr;
     QAction* revertAction = nullptr;
     bool reassignChosen = false;
