@@ -59,7 +59,19 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     setWindowTitle(tr("Zem hotkeys editor"));
     userSource = tr("user");
     systemSource = tr("system");
+    // Every edit is a step that can be taken back.
+    undoStack = new QUndoStack(this);
+    files = new FileCommands(this, edited, undoStack, this);
 
+    createCentralParts();
+    createActions();
+    createMenus();
+    createToolBar();
+    connectParts();
+}
+
+void KeysConfForm::createCentralParts()
+{
     auto* central = new QWidget(this);
     setCentralWidget(central);
     mainLayout = new QVBoxLayout(central);
@@ -96,7 +108,10 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     keyWidget = keyPanel->recorder();
     noKeyRadio = keyPanel->clearRadio();
     mainLayout->addWidget(keyPanel);
+}
 
+void KeysConfForm::createActions()
+{
     fileNewAction = makeAction(this, tr("&New file"), "document-new");
     fileOpenAction = makeAction(this, tr("&Open..."), "document-open");
     fileRestoreAction = makeAction(this, tr("&Restore..."), "view-refresh");
@@ -134,7 +149,10 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     };
     for (const auto& [action, name] : names)
         action->setObjectName(QLatin1String(name));
+}
 
+void KeysConfForm::createMenus()
+{
     menuBar = new QMenuBar(this);
     fileMenu = new QMenu(tr("&File"), menuBar);
     fileMenu->addAction(fileNewAction);
@@ -146,8 +164,6 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     fileMenu->addSeparator();
     fileMenu->addAction(fileExitAction);
     menuBar->addMenu(fileMenu);
-    // Every edit is a step that can be taken back.
-    undoStack = new QUndoStack(this);
     QAction* undoAction = undoStack->createUndoAction(this, tr("Undo"));
     undoAction->setObjectName(QStringLiteral("undoAction"));
     undoAction->setShortcut(QKeySequence::Undo);
@@ -180,7 +196,10 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     helpMenu->insertSeparator(helpMenu->actions().value(1));
     menuBar->addMenu(helpMenu);
     setMenuWidget(menuBar);
+}
 
+void KeysConfForm::createToolBar()
+{
     toolBar = new QToolBar(tr("Actions toolbar"), this);
     toolBar->setObjectName(QStringLiteral("toolbar"));
     toolBar->addAction(fileNewAction);
@@ -205,7 +224,10 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
         if (action != fileRestoreAction)
             action->setToolTip(name);
     }
+}
 
+void KeysConfForm::connectParts()
+{
     // The order matters: a recorded key marks the document modified before it is assigned.
     connect(fileNewAction, &QAction::triggered, this, &KeysConfForm::fileNew);
     connect(fileOpenAction, &QAction::triggered, this, &KeysConfForm::fileOpen);
@@ -225,7 +247,6 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     connect(cloneCommandAction, &QAction::triggered, this, &KeysConfForm::cloneCommand);
     connect(revertAction, &QAction::triggered, this, &KeysConfForm::revertToSystemBinding);
     connect(undoStack, &QUndoStack::indexChanged, this, &KeysConfForm::fileChanged);
-    files = new FileCommands(this, edited, undoStack, this);
     connect(edited, &EditedFile::changedOnDisk, files, &FileCommands::filesChangedOnDisk);
     connect(edited, &EditedFile::bindingsChanged, this, &KeysConfForm::followBindings);
 }

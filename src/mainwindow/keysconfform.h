@@ -115,6 +115,12 @@ protected:
     void contextMenuEvent(QContextMenuEvent* event) override;
 
 private:
+    // The parts of the window, made in this order.
+    void createCentralParts();
+    void createActions();
+    void createMenus();
+    void createToolBar();
+    void connectParts();
     void showHeaderMenu(const QPoint& position);
     // The one way to make an edit: the bindings become `after` as one step of the undo stack,
     // and the tree follows, with the row the edit is about made current.
