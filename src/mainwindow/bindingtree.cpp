@@ -84,14 +84,27 @@ void BindingTree::show(QTreeWidgetItem* row, const Binding& binding)
                                                               : userText);
 }
 
+QString BindingTree::shownKey(const QString& key)
+{
+    const QString shown =
+        QKeySequence::fromString(key, QKeySequence::NativeText).toString(QKeySequence::NativeText);
+    return shown.isEmpty() ? key : shown;
+}
+
 void BindingTree::showKey(QTreeWidgetItem* row, const QString& key)
 {
     if (!row)
         return;
     row->setData(1, Qt::UserRole, key);
-    const QString shown =
-        QKeySequence::fromString(key, QKeySequence::NativeText).toString(QKeySequence::NativeText);
-    row->setText(1, shown.isEmpty() ? key : shown);
+    row->setText(1, shownKey(key));
+}
+
+QString BindingTree::actionText(BindingId id) const
+{
+    const Binding* binding = model->find(id);
+    if (!binding)
+        return QString();
+    return binding->isCommand() ? binding->command : functionTexts.value(binding->function);
 }
 
 void BindingTree::refresh(BindingId id)
@@ -179,15 +192,18 @@ const QVector<BindingTree::SearchRow>& BindingTree::searchRows()
     if (searchedCurrent)
         return searched;
     searched.clear();
-    for (int g = 0; g < tree->topLevelItemCount(); ++g) {
-        const QTreeWidgetItem* group = tree->topLevelItem(g);
-        for (int i = 0; i < group->childCount(); ++i) {
-            QTreeWidgetItem* row = group->child(i);
-            // A command row's function column says only ExecCommand.
-            const QString function = group == commandGroupRow ? QString() : row->text(2);
-            searched.append({row, BindingFilter::searchText(row->text(0), function, row->text(1)),
-                             row->data(1, Qt::UserRole).toString()});
-        }
+    // What a filter looks at comes from the bindings, not from what the rows show.
+    for (const Binding* binding : model->rows()) {
+        QTreeWidgetItem* row = rowOf(binding->id);
+        if (!row)
+            continue;
+        const QString action =
+            binding->isCommand() ? binding->command : functionTexts.value(binding->function);
+        // A command has no function name to be found by.
+        const QString function =
+            binding->isCommand() ? QString() : HotkeysModel::functionNames().at(binding->function);
+        searched.append(
+            {row, BindingFilter::searchText(action, function, shownKey(binding->key)), binding->key});
     }
     searchedCurrent = true;
     return searched;

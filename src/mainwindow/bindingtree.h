@@ -27,6 +27,12 @@ public:
     BindingId bindingAt(const QTreeWidgetItem* row) const { return ids.value(row, 0); }
     QTreeWidgetItem* rowOf(BindingId id) const { return rows.value(id, nullptr); }
 
+    // What a binding's row says in its first column: the function's description, or the
+    // command line.
+    QString actionText(BindingId id) const;
+    // A stored key in the desktop's own words, or, when Qt cannot read it, as it stands.
+    static QString shownKey(const QString& key);
+
     // Puts a stored key into a row: at Qt::UserRole of the key column, and as its shown text, which
     // is the key in the desktop's own words or, when Qt cannot read it, the text as it stands.
     static void showKey(QTreeWidgetItem* row, const QString& key);

@@ -403,15 +403,10 @@ QTreeWidgetItem* KeysConfForm::setActionsEnabled(QTreeWidgetItem* item)
         enable(true, true, true, true);
         return item;
     }
-    const QString function = item->text(2);
-    if (function.isEmpty())
+    const Binding* binding = model.find(bindingAt(item));
+    if (!binding)
         return nullptr;
-    int rowsOfFunction = 0;
-    for (int i = 0; i < parent->childCount(); ++i) {
-        if (parent->child(i)->text(2) == function)
-            ++rowsOfFunction;
-    }
-    enable(false, false, rowsOfFunction >= 2, true);
+    enable(false, false, model.rowsOf(binding->function).size() >= 2, true);
     return item;
 }
 

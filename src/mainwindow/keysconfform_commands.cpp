@@ -34,9 +34,9 @@ void KeysConfForm::itemDoubleClicked(QTreeWidgetItem* clicked, int)
         return;
 
     SelectCommandDialog dialog(this);
-    dialog.setCommand(clicked->text(0));
-    if (dialog.exec() != QDialog::Accepted || dialog.command().isEmpty() ||
-        dialog.command() == clicked->text(0))
+    const QString command = bindingTree->actionText(bindingAt(clicked));
+    dialog.setCommand(command);
+    if (dialog.exec() != QDialog::Accepted || dialog.command().isEmpty() || dialog.command() == command)
         return;
     HotkeysModel after = model;
     after.setCommand(bindingAt(clicked), dialog.command());
@@ -51,7 +51,7 @@ void KeysConfForm::cloneCommand()
     HotkeysModel after = model;
     const BindingId id = after.cloneRow(bindingAt(target));
     if (id)
-        edit(tr("Clone %1").arg(target->text(0)), id, after);
+        edit(tr("Clone %1").arg(bindingTree->actionText(bindingAt(target))), id, after);
 }
 
 void KeysConfForm::deleteCommand()
@@ -68,7 +68,7 @@ void KeysConfForm::deleteCommand()
     const BindingId id = bindingAt(target);
     if (!after.removeRow(id))
         return;
-    edit(tr("Delete %1").arg(target->text(0)), id, after);
+    edit(tr("Delete %1").arg(bindingTree->actionText(id)), id, after);
     keysTree->setCurrentItem(parent);
     parent->setSelected(true);
 }
@@ -81,7 +81,7 @@ void KeysConfForm::revertToSystemBinding()
     HotkeysModel after = model;
     BindingId focus = id;
     const QStringList heldElsewhere = after.revert(id, &focus);
-    edit(tr("Revert %1 to the system binding").arg(targetRow()->text(0)), focus, after);
+    edit(tr("Revert %1 to the system binding").arg(bindingTree->actionText(id)), focus, after);
     if (!heldElsewhere.isEmpty()) {
         QStringList shown;
         for (const QString& key : heldElsewhere)

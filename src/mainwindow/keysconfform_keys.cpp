@@ -48,16 +48,15 @@ void KeysConfForm::setKey(const QKeySequence& seq)
         }
         // The key moves here; the row that held it is left without one.
         const BindingId holder = model.holderOf(key, id);
-        const QString holderText = bindingTree->rowOf(holder)->text(0);
+        const QString holderText = bindingTree->actionText(holder);
         after.reassign(holder, id);
         keyPanel->showRecorded(seq);
-        edit(tr("Reassign %1 from %2 to %3").arg(shown, holderText, keysTree->currentItem()->text(0)), id,
-             after);
+        edit(tr("Reassign %1 from %2 to %3").arg(shown, holderText, bindingTree->actionText(id)), id, after);
         return;
     }
     after.setKey(id, key);
     keyPanel->showRecorded(seq);
-    edit(tr("Assign %1 to %2").arg(shown, keysTree->currentItem()->text(0)), id, after);
+    edit(tr("Assign %1 to %2").arg(shown, bindingTree->actionText(id)), id, after);
 }
 
 bool KeysConfForm::isKeyPresent(const QKeySequence& seq, bool warnuser)
@@ -67,21 +66,22 @@ bool KeysConfForm::isKeyPresent(const QKeySequence& seq, bool warnuser)
     // Keys are compared as the file will hold them, so two rows can never end up on one key.
     const BindingId holderId =
         model.holderOf(seq.toString(QKeySequence::PortableText), bindingAt(keysTree->currentItem()));
-    QTreeWidgetItem* holder = bindingTree->rowOf(holderId);
+    const Binding* holder = model.find(holderId);
     reassignChosen = false;
     if (!holder)
         return false;
 
     if (warnuser) {
         // The holder is named by its function, or as a command for command rows.
-        const QString function = holder->text(2);
         //: Names a command entry in "to the %2 action (%3)", where %3 is its command line.
-        const QString holderName = function == QLatin1String("ExecCommand") ? tr("command") : function;
-        QMessageBox box(QMessageBox::Warning, tr("Whoopsie! Key conflict."),
-                        tr("Ouch! The %1 key combination has already been allocated\nto the %2 action "
-                           "(%3).\n\nPlease choose a unique key combination.")
-                            .arg(seq.toString(QKeySequence::NativeText), holderName, holder->text(0)),
-                        QMessageBox::Ok | QMessageBox::Apply, this);
+        const QString holderName =
+            holder->isCommand() ? tr("command") : HotkeysModel::functionNames().at(holder->function);
+        QMessageBox box(
+            QMessageBox::Warning, tr("Whoopsie! Key conflict."),
+            tr("Ouch! The %1 key combination has already been allocated\nto the %2 action "
+               "(%3).\n\nPlease choose a unique key combination.")
+                .arg(seq.toString(QKeySequence::NativeText), holderName, bindingTree->actionText(holderId)),
+            QMessageBox::Ok | QMessageBox::Apply, this);
         //: Moves the key combination to the edited row, leaving the other one without a key.
         box.button(QMessageBox::Apply)->setText(tr("Reassign"));
         box.setDefaultButton(QMessageBox::Ok);
@@ -98,7 +98,7 @@ void KeysConfForm::opt_nokeys_checked()
         return;
     HotkeysModel after = model;
     after.clearKey(id);
-    edit(tr("Clear the key of %1").arg(keysTree->currentItem()->text(0)), id, after);
+    edit(tr("Clear the key of %1").arg(bindingTree->actionText(id)), id, after);
     keyWidget->clearKeySequence();
     keyWidget->setEnabled(false);
 }
