@@ -1,6 +1,7 @@
 #include "keysconfform.h"
 
 #include "bindingtree.h"
+#include "editcommands.h"
 #include "filterbar.h"
 #include "handbook.h"
 #include "hotkeysfile.h"
@@ -91,6 +92,8 @@ void KeysConfForm::createCentralParts()
     mainLayout->addWidget(keysTree);
     bindingTree = std::make_unique<BindingTree>(keysTree, &model);
     bindingTree->setSourceTexts(userSource, systemSource);
+    edits = std::make_unique<EditCommands>(edited, undoStack,
+                                           [this](BindingId id) { return bindingTree->actionText(id); });
     filterBar = new FilterBar(keysTree, bindingTree.get(), &model, central);
     mainLayout->insertWidget(0, filterBar);
     statusBar()->addPermanentWidget(filterBar->countLabel());
@@ -359,11 +362,6 @@ void KeysConfForm::updateRevertAction()
 void KeysConfForm::applyFilter()
 {
     filterBar->apply();
-}
-
-void KeysConfForm::edit(const QString& text, BindingId focus, const HotkeysModel& after)
-{
-    undoStack->push(new ModelCommand(edited, text, model, after, focus));
 }
 
 void KeysConfForm::followBindings(const HotkeysModel& before, BindingId focus)

@@ -11,6 +11,7 @@
 #include <memory>
 
 class BindingTree;
+class EditCommands;
 class FilterBar;
 class KeyPanel;
 class KKeySequenceWidget;
@@ -122,9 +123,7 @@ private:
     void createToolBar();
     void connectParts();
     void showHeaderMenu(const QPoint& position);
-    // The one way to make an edit: the bindings become `after` as one step of the undo stack,
-    // and the tree follows, with the row the edit is about made current.
-    void edit(const QString& text, BindingId focus, const HotkeysModel& after);
+    // The tree follows every change of the bindings, with the row it is about made current.
     void followBindings(const HotkeysModel& before, BindingId focus);
     void updateRevertAction();
     void connectKeyWidget();
@@ -167,6 +166,7 @@ private:
     EditedFile* edited;
     HotkeysModel& model;
     std::unique_ptr<BindingTree> bindingTree;
+    std::unique_ptr<EditCommands> edits;
     FileCommands* files = nullptr;
     QUndoStack* undoStack = nullptr;
     QAction* revertAction = nullptr;

@@ -1,6 +1,7 @@
 #include "keysconfform.h"
 
 #include "bindingtree.h"
+#include "editcommands.h"
 #include "hotkeysfile.h"
 #include "selectcommanddialog.h"
 
@@ -16,9 +17,7 @@ void KeysConfForm::newCommand()
     if (dialog.exec() != QDialog::Accepted || dialog.command().isEmpty())
         return;
 
-    HotkeysModel after = model;
-    const BindingId id = after.addCommand(dialog.command());
-    edit(tr("Add command %1").arg(dialog.command()), id, after);
+    edits->addCommand(dialog.command());
 }
 
 void KeysConfForm::editCommand()
@@ -38,9 +37,7 @@ void KeysConfForm::itemDoubleClicked(QTreeWidgetItem* clicked, int)
     dialog.setCommand(command);
     if (dialog.exec() != QDialog::Accepted || dialog.command().isEmpty() || dialog.command() == command)
         return;
-    HotkeysModel after = model;
-    after.setCommand(bindingAt(clicked), dialog.command());
-    edit(tr("Edit command %1").arg(dialog.command()), bindingAt(clicked), after);
+    edits->setCommand(bindingAt(clicked), dialog.command());
 }
 
 void KeysConfForm::cloneCommand()
@@ -48,10 +45,7 @@ void KeysConfForm::cloneCommand()
     QTreeWidgetItem* target = targetRow();
     if (!target || !target->parent())
         return;
-    HotkeysModel after = model;
-    const BindingId id = after.cloneRow(bindingAt(target));
-    if (id)
-        edit(tr("Clone %1").arg(bindingTree->actionText(bindingAt(target))), id, after);
+    edits->clone(bindingAt(target));
 }
 
 void KeysConfForm::deleteCommand()
@@ -64,11 +58,8 @@ void KeysConfForm::deleteCommand()
                               QMessageBox::Yes | QMessageBox::No, QMessageBox::No) != QMessageBox::Yes)
         return;
 
-    HotkeysModel after = model;
-    const BindingId id = bindingAt(target);
-    if (!after.removeRow(id))
+    if (!edits->remove(bindingAt(target)))
         return;
-    edit(tr("Delete %1").arg(bindingTree->actionText(id)), id, after);
     keysTree->setCurrentItem(parent);
     parent->setSelected(true);
 }
@@ -78,10 +69,7 @@ void KeysConfForm::revertToSystemBinding()
     const BindingId id = bindingAt(targetRow());
     if (!model.canRevert(id) || currentFile != userHotkeysFilePath())
         return;
-    HotkeysModel after = model;
-    BindingId focus = id;
-    const QStringList heldElsewhere = after.revert(id, &focus);
-    edit(tr("Revert %1 to the system binding").arg(bindingTree->actionText(id)), focus, after);
+    const QStringList heldElsewhere = edits->revert(id);
     if (!heldElsewhere.isEmpty()) {
         QStringList shown;
         for (const QString& key : heldElsewhere)

@@ -1,6 +1,7 @@
 #include "keysconfform.h"
 
 #include "bindingtree.h"
+#include "editcommands.h"
 #include "keypanel.h"
 #include "kkeysequencewidget.h"
 
@@ -37,9 +38,7 @@ void KeysConfForm::setKey(const QKeySequence& seq)
     const BindingId id = bindingAt(keysTree->currentItem());
     if (!id || seq.isEmpty())
         return;
-    HotkeysModel after = model;
     const QString key = seq.toString(QKeySequence::PortableText);
-    const QString shown = seq.toString(QKeySequence::NativeText);
     if (isKeyPresent(seq, true)) {
         if (!reassignChosen) {
             // The panel shows the row's own key again, not the one refused.
@@ -47,16 +46,12 @@ void KeysConfForm::setKey(const QKeySequence& seq)
             return;
         }
         // The key moves here; the row that held it is left without one.
-        const BindingId holder = model.holderOf(key, id);
-        const QString holderText = bindingTree->actionText(holder);
-        after.reassign(holder, id);
         keyPanel->showRecorded(seq);
-        edit(tr("Reassign %1 from %2 to %3").arg(shown, holderText, bindingTree->actionText(id)), id, after);
+        edits->reassign(model.holderOf(key, id), id);
         return;
     }
-    after.setKey(id, key);
     keyPanel->showRecorded(seq);
-    edit(tr("Assign %1 to %2").arg(shown, bindingTree->actionText(id)), id, after);
+    edits->assign(id, key);
 }
 
 bool KeysConfForm::isKeyPresent(const QKeySequence& seq, bool warnuser)
@@ -96,9 +91,7 @@ void KeysConfForm::opt_nokeys_checked()
     const BindingId id = bindingAt(keysTree->currentItem());
     if (!id)
         return;
-    HotkeysModel after = model;
-    after.clearKey(id);
-    edit(tr("Clear the key of %1").arg(bindingTree->actionText(id)), id, after);
+    edits->clear(id);
     keyWidget->clearKeySequence();
     keyWidget->setEnabled(false);
 }
