@@ -1,5 +1,7 @@
 #include "functioncatalogue.h"
 
+#include <QHash>
+
 #include <QCoreApplication>
 
 #include <iterator>
@@ -223,4 +225,16 @@ const QStringList& catalogueFunctionNames()
         return result;
     }();
     return names;
+}
+
+int catalogueFunctionIndex(const QString& name)
+{
+    static const QHash<QString, int> index = [] {
+        QHash<QString, int> result;
+        const QStringList& names = catalogueFunctionNames();
+        for (int i = 0; i < names.size(); ++i)
+            result.insert(names.at(i), i);
+        return result;
+    }();
+    return index.value(name, -1);
 }

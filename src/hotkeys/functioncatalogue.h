@@ -19,3 +19,5 @@ QVector<WmFunctionEntry> buildWmFunctionTable(bool translated = true);
 
 // The names of the catalogue's functions, in its order (a function's index in the catalogue).
 const QStringList& catalogueFunctionNames();
+// A function's index in the catalogue; -1 for a name it does not hold.
+int catalogueFunctionIndex(const QString& name);

@@ -3,37 +3,23 @@
 #include "functioncatalogue.h"
 #include "hotkeysentries.h"
 #include "hotkeysfile.h"
-#include "hotkeyspatch.h"
+#include "hotkeysreader.h"
+#include "hotkeyswriter.h"
 #include "keyforms.h"
 
 #include <QCoreApplication>
 #include <QHash>
-#include <QRegularExpression>
 #include <QSet>
 
 #include <algorithm>
 
 namespace {
 
-const QString disableValue = QStringLiteral("Disable");
-
 // Its messages, translated in a context of their own.
 struct HotkeysFile
 {
     Q_DECLARE_TR_FUNCTIONS(HotkeysFile)
 };
-
-const QHash<QString, int>& functionIndex()
-{
-    static const QHash<QString, int> index = [] {
-        QHash<QString, int> result;
-        const QStringList& names = HotkeysModel::functionNames();
-        for (int i = 0; i < names.size(); ++i)
-            result.insert(names.at(i), i);
-        return result;
-    }();
-    return index;
-}
 
 const std::shared_ptr<const HotkeysEntries>& emptyFile()
 {
@@ -43,32 +29,6 @@ const std::shared_ptr<const HotkeysEntries>& emptyFile()
         return entries;
     }();
     return empty;
-}
-
-std::shared_ptr<const EntryOrigin> originOf(const HotkeysEntries& file, const KeyEntry& entry,
-                                            const QString& action, bool editedFile)
-{
-    auto origin = std::make_shared<EntryOrigin>();
-    origin->rawValue = entry.value;
-    origin->readAction = action;
-    origin->editedFile = editedFile;
-    if (entry.counting >= 0) {
-        origin->lineNumber = file.lines().lines().at(entry.counting).number;
-        if (editedFile)
-            origin->line = entry.counting;
-    }
-    return origin;
-}
-
-// Why a value of the editor's making cannot stand in the file; empty when it can.
-QString unwritableValue(const QByteArray& value)
-{
-    const auto isBlank = [](char c) { return c == ' ' || c == '\t'; };
-    if (value.contains('\n') || value.contains('\r') || value.contains('\0') ||
-        (!value.isEmpty() && (isBlank(value.front()) || isBlank(value.back()))))
-        return HotkeysFile::tr("The action \"%1\" cannot be written to a hotkeys file")
-            .arg(printableText(QString::fromLocal8Bit(value)));
-    return QString();
 }
 
 } // namespace
@@ -108,96 +68,7 @@ bool HotkeysModel::load(const QString& path, const QString& systemPath, QString*
 bool HotkeysModel::loadBytes(const QByteArray& bytes, const QByteArray& systemBytes, bool withSystem,
                              bool* systemFailed)
 {
-    auto mainFile = std::make_shared<HotkeysEntries>();
-    HotkeysEntries systemFile;
-    if (!mainFile->read(bytes))
-        return false;
-    if (withSystem && !systemFile.read(systemBytes)) {
-        if (systemFailed)
-            *systemFailed = true;
-        return false;
-    }
-
-    HotkeysModel fresh;
-    fresh.lastId = lastId;
-    for (auto& rows : fresh.functionRows)
-        rows.first().id = ++fresh.lastId;
-    fresh.base = mainFile;
-
-    QSet<QByteArray> boundKeys;
-    QSet<QByteArray> disabledKeys;
-    QHash<int, QVector<Binding>> furtherRows;
-    const auto addEntries = [&](const HotkeysEntries& file, BindingSource source) {
-        const bool edited = source == BindingSource::User;
-        for (const KeyEntry& entry : file.entries()) {
-            const QString key = fromFileKey(QString::fromLocal8Bit(entry.key));
-            const QString value = unquoted(QString::fromLocal8Bit(entry.value));
-            const bool isKey = isKeyIdentity(entry.identity);
-            const QByteArray fileKey =
-                entry.counting >= 0 ? file.lines().lines().at(entry.counting).key : entry.key;
-            const auto origin = originOf(file, entry, value, edited);
-            if (!edited && isKey && value != disableValue) {
-                // Kept whether or not the user's file hides it: freeing the key brings it back.
-                fresh.systemKeys.insert(entry.identity);
-                const int function = functionIndex().value(value, -1);
-                if (function >= 0)
-                    fresh.systemBindings[function].append(
-                        Binding{0, function, QString(), key, fileKey, source, origin, false});
-                else if (!value.startsWith(QLatin1String("ZEMWM_")))
-                    fresh.systemCommands.append(Binding{0, -1, value, key, fileKey, source, origin, false});
-            }
-            // Whoever bound the key first keeps it: the user's file before the system one.
-            if (isKey && boundKeys.contains(entry.identity))
-                continue;
-
-            if (value.startsWith(QLatin1String("ZEMWM_"))) {
-                const int function = functionIndex().value(value, -1);
-                if (function < 0) {
-                    // A function of a newer window manager: not shown, but never lost.
-                    if (edited)
-                        fresh.kept.append({fileKey, origin});
-                    continue;
-                }
-                Binding& first = fresh.functionRows[function].first();
-                // The first row is taken by the first entry read, keyless or not.
-                if (first.source == BindingSource::Unset) {
-                    first.key = key;
-                    first.fileKey = fileKey;
-                    first.source = source;
-                    first.origin = origin;
-                } else {
-                    furtherRows[function].append(
-                        Binding{++fresh.lastId, function, QString(), key, fileKey, source, origin, false});
-                }
-            } else if (value == disableValue) {
-                if (!isKey) {
-                    // A disabled placeholder switches nothing off; it is kept as it stands.
-                    if (edited)
-                        fresh.kept.append({fileKey, origin});
-                    continue;
-                }
-                if (!disabledKeys.contains(entry.identity)) {
-                    disabledKeys.insert(entry.identity);
-                    fresh.disabled.append({key, fileKey, origin});
-                }
-            } else {
-                fresh.commandRows.append(
-                    Binding{++fresh.lastId, -1, value, key, fileKey, source, origin, false});
-            }
-            if (isKey)
-                boundKeys.insert(entry.identity);
-        }
-    };
-    addEntries(*mainFile, BindingSource::User);
-    if (withSystem)
-        addEntries(systemFile, BindingSource::System);
-
-    // A function's further rows follow its first row, the one read last nearest to it.
-    for (auto it = furtherRows.cbegin(); it != furtherRows.cend(); ++it)
-        std::copy(it->crbegin(), it->crend(), std::back_inserter(fresh.functionRows[it.key()]));
-
-    *this = std::move(fresh);
-    return true;
+    return HotkeysReader(this).merge(bytes, systemBytes, withSystem, systemFailed);
 }
 
 QVector<const Binding*> HotkeysModel::rows() const
@@ -528,7 +399,7 @@ BindingId HotkeysModel::addCommand(const QString& command)
 
 BindingId HotkeysModel::rowForFunction(const QString& name)
 {
-    const int function = functionIndex().value(name, -1);
+    const int function = catalogueFunctionIndex(name);
     if (function < 0)
         return 0;
     for (const Binding& row : functionRows.at(function)) {
@@ -576,97 +447,7 @@ bool HotkeysModel::removeRow(BindingId id)
     return true;
 }
 
-void HotkeysModel::assignPlaceholders(bool userFile)
-{
-    static const QRegularExpression placeholder(QStringLiteral("none([0-9]+)$"));
-    QSet<int> inUse;
-    const auto note = [&](const QByteArray& fileKey) {
-        const QRegularExpressionMatch match = placeholder.match(QString::fromLatin1(foldedKey(fileKey)));
-        if (match.hasMatch())
-            inUse.insert(match.captured(1).toInt());
-    };
-    for (const Binding* row : rows())
-        note(row->fileKey);
-    for (const Kept& entry : qAsConst(kept))
-        note(entry.fileKey);
-    for (const KeyEntry& entry : base->entries())
-        note(entry.key);
-
-    int next = 0;
-    for (Binding& row : commandRows) {
-        if (!row.fileKey.isEmpty() || (userFile && row.source != BindingSource::User))
-            continue;
-        while (inUse.contains(next))
-            ++next;
-        inUse.insert(next);
-        row.key = QStringLiteral("None%1").arg(next);
-        row.fileKey = toFileKey(row.key).toLocal8Bit();
-        row.source = BindingSource::User;
-    }
-}
-
 bool HotkeysModel::toBytes(bool userFile, QByteArray* bytes, QString* reason)
 {
-    assignPlaceholders(userFile);
-    const int commandRank = functionNames().size();
-
-    // What the file is to mean: one entry per key, in the order of the rows.
-    QVector<QByteArray> order;
-    QHash<QByteArray, WantedEntry> wanted;
-    const auto want = [&](const QByteArray& fileKey, WantedEntry entry, bool replace) {
-        const QByteArray identity = keyIdentity(fileKey);
-        const auto it = wanted.find(identity);
-        if (it == wanted.end()) {
-            order.append(identity);
-            wanted.insert(identity, entry);
-        } else if (replace) {
-            // As the reader sets a value: the key keeps its place and takes the new value.
-            it->value = entry.value;
-            it->rank = entry.rank;
-            it->keyProblem = entry.keyProblem;
-            it->valueProblem = entry.valueProblem;
-        }
-    };
-    for (const Binding* row : rows()) {
-        if ((userFile && row->source != BindingSource::User) || row->fileKey.isEmpty())
-            continue;
-        const QString action = row->isCommand() ? row->command : functionNames().at(row->function);
-        const EntryOrigin* origin = row->origin.get();
-        WantedEntry entry{row->fileKey, QByteArray(), row->isCommand() ? commandRank : row->function,
-                          QString(), QString()};
-        if (origin && action == origin->readAction) {
-            entry.value = origin->rawValue;
-        } else if (row->isCommand()) {
-            entry.value = '"' + row->command.toLocal8Bit() + '"';
-            entry.valueProblem = commandProblem(row->command);
-        } else {
-            entry.value = action.toLocal8Bit();
-        }
-        if (entry.valueProblem.isEmpty())
-            entry.valueProblem = unwritableValue(entry.value);
-        if (origin && origin->editedFile)
-            entry.fromLine = origin->line;
-        const bool placeholder = !isKeyIdentity(keyIdentity(row->fileKey));
-        if (!isWritableFileKey(row->fileKey) ||
-            (row->keyRecorded && !placeholder && !readsBackAsWritten(row->key)))
-            entry.keyProblem = HotkeysFile::tr("The key \"%1\" cannot be written to a hotkeys file")
-                                   .arg(printableText(QString::fromLocal8Bit(row->fileKey)));
-        want(row->fileKey, entry, true);
-    }
-    for (const DisabledKey& key : qAsConst(disabled)) {
-        const EntryOrigin* origin = key.origin.get();
-        WantedEntry entry{key.fileKey, "\"Disable\"", commandRank + 1, QString(), QString()};
-        if (origin && origin->readAction == disableValue)
-            entry.value = origin->rawValue;
-        if (!isWritableFileKey(key.fileKey))
-            entry.keyProblem = HotkeysFile::tr("The key \"%1\" cannot be written to a hotkeys file")
-                                   .arg(printableText(QString::fromLocal8Bit(key.fileKey)));
-        want(key.fileKey, entry, true);
-    }
-    // What was read but not shown stays, unless a shown binding took its key since.
-    for (const Kept& entry : qAsConst(kept))
-        want(entry.fileKey, WantedEntry{entry.fileKey, entry.origin->rawValue, -1, QString(), QString()},
-             false);
-
-    return HotkeysPatch(*base, order, wanted).apply(bytes, reason);
+    return HotkeysWriter(this).write(userFile, bytes, reason);
 }

@@ -126,6 +126,9 @@ public:
     bool toBytes(bool userFile, QByteArray* bytes, QString* reason);
 
 private:
+    friend class HotkeysReader;
+    friend class HotkeysWriter;
+
     struct Kept
     {
         QByteArray fileKey;
@@ -145,7 +148,6 @@ private:
     // The key of a row the revert took it from, back to the row without a key the system file
     // gives it to; false when there is none, and then it is switched off as any freed key.
     void giveBackOrKeepOff(const Binding& freed);
-    void assignPlaceholders(bool userFile);
 
     QVector<QVector<Binding>> functionRows;
     QVector<Binding> commandRows;

@@ -1,7 +1,7 @@
 #include "hotkeyspatch.h"
 
-#include "hotkeysentries.h"
 #include "functioncatalogue.h"
+#include "hotkeysentries.h"
 #include "keyforms.h"
 
 #include <algorithm>
