@@ -37,6 +37,84 @@ int printUsage()
     return UsageShown;
 }
 
+// The second start hands over to the running editor; what was asked of it is not done there.
+int showRunningEditor(MyApplication* app, int argc, char** argv)
+{
+    app->sendMessage(QStringLiteral("show"), 5000);
+    if (argc > 1)
+        std::fprintf(stderr, "zem-admin-hotkeys: %s\n",
+                     QObject::tr("an editor already runs on this display and was brought forward; "
+                                 "%1 was not opened there")
+                         .arg(printableText(QFile::decodeName(argv[1])))
+                         .toLocal8Bit()
+                         .constData());
+    delete app;
+    return AnotherInstanceShown;
+}
+
+// The file to edit: the one named, created when the user agrees, or the user's own. Empty, with
+// the exit status, when the start ends here.
+QString chooseFile(const QStringList& arguments, char** argv, int* status)
+{
+    QString path;
+    if (arguments.size() == 1) {
+        path = arguments.first();
+        if (!isFaithfulFileName(QByteArray(argv[1]))) {
+            // Read in the locale's encoding it names another file, which would be created.
+            std::fprintf(
+                stderr, "zem-admin-hotkeys: %s: %s\n",
+                printableText(QFile::decodeName(argv[1])).toLocal8Bit().constData(),
+                QObject::tr("the file name is not valid in the locale's encoding").toLocal8Bit().constData());
+            *status = CreationDeclined;
+            return QString();
+        }
+        if (path.startsWith(QLatin1Char('%'))) {
+            // An unexpanded field code from a desktop entry: behave as if started without one.
+            path.clear();
+        } else if (!QFile::exists(path)) {
+            const QMessageBox::StandardButton answer = QMessageBox::question(
+                nullptr, QObject::tr("Warning"), QObject::tr("File %1 doesn't exist. Create?").arg(path),
+                QMessageBox::Yes | QMessageBox::No);
+            if (answer != QMessageBox::Yes) {
+                *status = CreationDeclined;
+                return QString();
+            }
+        }
+    }
+    if (path.isEmpty())
+        path = userHotkeysFilePath();
+    // Created all or nothing: a full disk must not leave an empty file that no later start can read.
+    QString reason;
+    if (!QFile::exists(path) && !writeFileSafely(path, emptyHotkeysFile, &reason)) {
+        std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n", printableText(path).toLocal8Bit().constData(),
+                     reason.toLocal8Bit().constData());
+        QMessageBox::warning(nullptr, QObject::tr("Attention"),
+                             QObject::tr("Can't open/create file:\n%1").arg(path) + QLatin1Char('\n') +
+                                 reason,
+                             QMessageBox::Ok);
+        *status = CreationFailed;
+        return QString();
+    }
+    return path;
+}
+
+// The window on the file, and the event loop until it closes.
+int runEditor(MyApplication* app, KeysConfForm* form, const QString& path)
+{
+    if (!form->init(path)) {
+        QMessageBox::warning(nullptr, QObject::tr("Attention"),
+                             QObject::tr("Can't parse file:\n%1").arg(form->loadFailure()), QMessageBox::Ok);
+        return LoadFailed;
+    }
+    QObject::connect(app, &MyApplication::messageReceived, form, &KeysConfForm::messageReceived);
+    QObject::connect(app, &QGuiApplication::lastWindowClosed, app, &QCoreApplication::quit);
+    // The session's end asks about unsaved edits itself, once, instead of closing the window.
+    QGuiApplication::setFallbackSessionManagementEnabled(false);
+    QObject::connect(app, &QGuiApplication::commitDataRequest, form, &KeysConfForm::commitData);
+    form->show();
+    return app->exec();
+}
+
 } // namespace
 
 int main(int argc, char** argv)
@@ -59,20 +137,8 @@ int main(int argc, char** argv)
 
     Q_INIT_RESOURCE(icons);
     auto* app = new MyApplication(singleInstanceId(), argc, argv);
-    if (app->isRunning()) {
-        app->sendMessage(QStringLiteral("show"), 5000);
-        // What was asked of this start is not done: the running editor keeps its own file.
-        if (argc > 1)
-            std::fprintf(stderr, "zem-admin-hotkeys: %s\n",
-                         QObject::tr("an editor already runs on this display and was brought forward; "
-                                     "%1 was not opened there")
-                             .arg(printableText(QFile::decodeName(argv[1])))
-                             .toLocal8Bit()
-                             .constData());
-        delete app;
-        return AnotherInstanceShown;
-    }
-
+    if (app->isRunning())
+        return showRunningEditor(app, argc, argv);
     zemInit(ZEM_VERSION_STRING, "Zem hotkeys editor");
 
     // The toolkit has taken its own options out of argc and argv by now.
@@ -86,68 +152,11 @@ int main(int argc, char** argv)
 
     auto* form = new KeysConfForm();
     form->setWindowIcon(editorWindowIcon());
-
-    QString path;
-    if (arguments.size() == 1) {
-        path = arguments.first();
-        if (!isFaithfulFileName(QByteArray(argv[1]))) {
-            // Read in the locale's encoding it names another file, which would be created.
-            std::fprintf(
-                stderr, "zem-admin-hotkeys: %s: %s\n",
-                printableText(QFile::decodeName(argv[1])).toLocal8Bit().constData(),
-                QObject::tr("the file name is not valid in the locale's encoding").toLocal8Bit().constData());
-            delete form;
-            delete app;
-            return CreationDeclined;
-        }
-        if (path.startsWith(QLatin1Char('%'))) {
-            // An unexpanded field code from a desktop entry: behave as if started without one.
-            path.clear();
-        } else if (!QFile::exists(path)) {
-            const QMessageBox::StandardButton answer = QMessageBox::question(
-                nullptr, QObject::tr("Warning"), QObject::tr("File %1 doesn't exist. Create?").arg(path),
-                QMessageBox::Yes | QMessageBox::No);
-            if (answer != QMessageBox::Yes) {
-                delete form;
-                delete app;
-                return CreationDeclined;
-            }
-        }
-    }
-    if (path.isEmpty())
-        path = userHotkeysFilePath();
-
-    // Created all or nothing: a full disk must not leave an empty file that no later start can read.
-    QString reason;
-    if (!QFile::exists(path) && !writeFileSafely(path, emptyHotkeysFile, &reason)) {
-        std::fprintf(stderr, "zem-admin-hotkeys: %s: %s\n", printableText(path).toLocal8Bit().constData(),
-                     reason.toLocal8Bit().constData());
-        QMessageBox::warning(nullptr, QObject::tr("Attention"),
-                             QObject::tr("Can't open/create file:\n%1").arg(path) + QLatin1Char('\n') +
-                                 reason,
-                             QMessageBox::Ok);
-        delete form;
-        delete app;
-        return CreationFailed;
-    }
-
-    if (!form->init(path)) {
-        QMessageBox::warning(nullptr, QObject::tr("Attention"),
-                             QObject::tr("Can't parse file:\n%1").arg(form->loadFailure()), QMessageBox::Ok);
-        delete form;
-        delete app;
-        return LoadFailed;
-    }
-
-    QObject::connect(app, &MyApplication::messageReceived, form, &KeysConfForm::messageReceived);
-    QObject::connect(app, &QGuiApplication::lastWindowClosed, app, &QCoreApplication::quit);
-    // The session's end asks about unsaved edits itself, once, instead of closing the window.
-    QGuiApplication::setFallbackSessionManagementEnabled(false);
-    QObject::connect(app, &QGuiApplication::commitDataRequest, form, &KeysConfForm::commitData);
-
-    form->show();
-    const int result = app->exec();
+    int status = 0;
+    const QString path = chooseFile(arguments, argv, &status);
+    if (!path.isEmpty())
+        status = runEditor(app, form, path);
     delete form;
     delete app;
-    return result;
+    return status;
 }
