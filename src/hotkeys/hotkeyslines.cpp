@@ -14,25 +14,40 @@ bool isNewLine(char c)
     return c == '\r' || c == '\n';
 }
 
-} // namespace
-
-HotkeysLines::HotkeysLines(const QByteArray& bytes) : data(bytes)
+// The reader's way through the bytes, step by step, with the lines it meets.
+class Scanner
 {
-    if (data.startsWith("\xEF\xBB\xBF"))
-        bomLength = 3;
-    // The reader stops at the first NUL byte.
-    const int size = data.contains('\0') ? data.indexOf('\0') : data.size();
-    const char* d = data.constData();
+public:
+    Scanner(const QByteArray& data, int from, QVector<HotkeysLine>* found)
+        : data(data), d(data.constData()), size(data.contains('\0') ? data.indexOf('\0') : data.size()),
+          found(found), p(from)
+    {
+    }
 
-    int p = bomLength;
-    int line = 1;
-    int section = -1;
+    void run()
+    {
+        while (p < size) {
+            int lineStart = p;
+            const int q = skipSpaces(p, &lineStart, true);
+            if (q >= size)
+                break;
+            if (d[q] == ';' || d[q] == '#')
+                p = endOfLine(q);
+            else if (d[q] == '[')
+                p = section(q, lineStart);
+            else
+                p = entry(q, lineStart);
+        }
+    }
+
+private:
     // Steps over one line end, "\r\n" counting as one.
-    const auto newLineLength = [&](int at) {
-        return d[at] == '\r' && at + 1 < size && d[at + 1] == '\n' ? 2 : 1;
-    };
+    int newLineLength(int at) const { return d[at] == '\r' && at + 1 < size && d[at + 1] == '\n' ? 2 : 1; }
+    int withLineEnd(int at) const { return at < size ? at + newLineLength(at) : at; }
+
     // Skips blanks and line ends from `at`; `lineStart` follows the line ends passed.
-    const auto skipSpaces = [&](int at, int* lineStart, bool crossLines) {
+    int skipSpaces(int at, int* lineStart, bool crossLines)
+    {
         while (at < size && isSpace(d[at]) && (crossLines || !isNewLine(d[at]))) {
             if (isNewLine(d[at])) {
                 at += newLineLength(at);
@@ -44,77 +59,66 @@ HotkeysLines::HotkeysLines(const QByteArray& bytes) : data(bytes)
             }
         }
         return at;
-    };
-    const auto endOfLine = [&](int at) {
+    }
+
+    int endOfLine(int at) const
+    {
         while (at < size && !isNewLine(d[at]))
             ++at;
         return at;
-    };
-    const auto withLineEnd = [&](int at) { return at < size ? at + newLineLength(at) : at; };
-    const auto trimmedEnd = [&](int from, int to) {
+    }
+
+    int trimmedEnd(int from, int to) const
+    {
         while (to > from && isSpace(d[to - 1]))
             --to;
         return to;
-    };
+    }
 
-    while (p < size) {
-        int lineStart = p;
-        const int startLine = line;
-        Q_UNUSED(startLine)
-        int q = skipSpaces(p, &lineStart, true);
-        if (q >= size)
-            break;
-        const int number = line;
-
-        if (d[q] == ';' || d[q] == '#') {
-            p = endOfLine(q);
-            continue;
+    // A section header at q; where the scan goes on.
+    int section(int q, int lineStart)
+    {
+        HotkeysLine header;
+        header.kind = HotkeysLine::Section;
+        header.number = line;
+        header.start = lineStart;
+        const int nameStart = skipSpaces(q + 1, nullptr, true);
+        const int r = endOfLine(nameStart);
+        int close = nameStart;
+        while (close < r && d[close] != ']')
+            ++close;
+        current = found->size();
+        if (close >= r) {
+            // The reader takes the unclosed name as the section of the lines that follow, a
+            // section no file names: they are out of [ShortCutKeys].
+            header.valid = false;
+            header.end = withLineEnd(r);
+            found->append(header);
+            return r;
         }
+        header.name = data.mid(nameStart, trimmedEnd(nameStart, close) - nameStart);
+        const int eol = endOfLine(close);
+        header.end = withLineEnd(eol);
+        found->append(header);
+        // The line end is left for the next skip, as the reader does; it counts the line.
+        return eol;
+    }
 
-        if (d[q] == '[') {
-            int r = skipSpaces(q + 1, nullptr, true);
-            const int nameStart = r;
-            r = endOfLine(r);
-            int close = nameStart;
-            while (close < r && d[close] != ']')
-                ++close;
-            HotkeysLine header;
-            header.kind = HotkeysLine::Section;
-            header.number = number;
-            header.start = lineStart;
-            if (close >= r) {
-                // The reader takes the unclosed name as the section of the lines that follow,
-                // a section no file names: they are out of [ShortCutKeys].
-                header.valid = false;
-                header.end = withLineEnd(r);
-                section = found.size();
-                found.append(header);
-                p = r;
-                continue;
-            }
-            header.name = data.mid(nameStart, trimmedEnd(nameStart, close) - nameStart);
-            const int eol = endOfLine(close);
-            header.end = withLineEnd(eol);
-            section = found.size();
-            found.append(header);
-            // The line end is left for the next skip, as the reader does; it counts the line.
-            p = eol;
-            continue;
-        }
-
+    // An entry, or a line the reader skips, at q; where the scan goes on.
+    int entry(int q, int lineStart)
+    {
         int r = q;
         while (r < size && d[r] != '=' && !isNewLine(d[r]))
             ++r;
         if (r >= size || d[r] != '=' || r == q) {
             // No "=": not an entry. An empty key: the rest of the line is skipped.
-            p = endOfLine(r);
-            continue;
+            return endOfLine(r);
         }
         HotkeysLine entry;
         entry.kind = HotkeysLine::Entry;
-        entry.number = number;
+        entry.number = line;
         entry.start = lineStart;
-        entry.section = section;
+        entry.section = current;
         entry.key = data.mid(q, trimmedEnd(q, r) - q);
         const int valueStart = skipSpaces(r + 1, nullptr, false);
         const int eol = endOfLine(valueStart);
@@ -124,9 +128,26 @@ HotkeysLines::HotkeysLines(const QByteArray& bytes) : data(bytes)
         entry.end = withLineEnd(eol);
         if (eol < size)
             ++line;
-        found.append(entry);
-        p = entry.end;
+        found->append(entry);
+        return entry.end;
     }
+
+    const QByteArray& data;
+    const char* d;
+    const int size; // the reader stops at the first NUL byte
+    QVector<HotkeysLine>* found;
+    int p;
+    int line = 1;
+    int current = -1; // the section the lines now met belong to
+};
+
+} // namespace
+
+HotkeysLines::HotkeysLines(const QByteArray& bytes) : data(bytes)
+{
+    if (data.startsWith("\xEF\xBB\xBF"))
+        bomLength = 3;
+    Scanner(data, bomLength, &found).run();
 }
 
 int HotkeysLines::leadingStart(int i) const
