@@ -120,36 +120,7 @@ void KKeySequenceButton::keyPressEvent(QKeyEvent* event)
         }
     }
 
-    // A first key without Control, Alt, Meta or the keypad must be one that makes sense alone.
-    if (d->keyCount == 0 && (held & ~quint32(Qt::ShiftModifier)) == 0 &&
-        !KKeySequenceWidgetPrivate::keyAllowedAlone(key) && !d->bareFirstKeyAllowed)
-        return;
-    if (key == 0)
-        return;
-
-    int combined = 0;
-    if (key == Qt::Key_Backtab && (d->heldModifiers & Qt::ShiftModifier))
-        combined = Qt::Key_Tab | int(d->heldModifiers);
-    else if (KKeyServer::isShiftAsModifierAllowed(key))
-        combined = key | int(d->heldModifiers);
-    else
-        combined = key | int(d->heldModifiers & ~quint32(Qt::ShiftModifier));
-
-    if (d->keyCount > 0)
-        d->sequence = KKeySequenceWidgetPrivate::appendKey(d->sequence, combined);
-    else
-        d->sequence = QKeySequence(combined);
-    ++d->keyCount;
-
-    if (!d->multiKeyShortcutsAllowed || d->keyCount >= quint32(KKeySequenceWidgetPrivate::longestSequence)) {
-        d->finishRecording();
-        return;
-    }
-    if (d->heldModifiers != 0)
-        d->releaseTimer.stop();
-    else
-        d->releaseTimer.start(KKeySequenceWidgetPrivate::releaseDelayMs);
-    d->refreshButtonText();
+    d->recordKey(key, held);
 }
 
 void KKeySequenceButton::keyReleaseEvent(QKeyEvent* event)

@@ -6,10 +6,10 @@
 #include <KKeyServer>
 #include <QApplication>
 #include <QHBoxLayout>
-#include <QWindow>
 #include <QIcon>
 #include <QMessageBox>
 #include <QToolButton>
+#include <QWindow>
 
 int KKeySequenceWidgetPrivate::releaseDelayMs = 600;
 
@@ -56,10 +56,11 @@ void KKeySequenceWidgetPrivate::beginRecording()
     // window (of this program too) becoming the active one. The keyboard grab itself moves no
     // window's focus, so it does not end it.
     qApp->installEventFilter(recordButton);
-    windowWatch = QObject::connect(qApp, &QGuiApplication::focusWindowChanged, recordButton, [this](QWindow* now) {
-        if (recording && now != recordButton->window()->windowHandle())
-            cancelRecording();
-    });
+    windowWatch =
+        QObject::connect(qApp, &QGuiApplication::focusWindowChanged, recordButton, [this](QWindow* now) {
+            if (recording && now != recordButton->window()->windowHandle())
+                cancelRecording();
+        });
     refreshButtonText();
 }
 
@@ -113,6 +114,40 @@ void KKeySequenceWidgetPrivate::unsupportedKey()
                          QMessageBox::Ok, QMessageBox::NoButton);
     sequence = previousSequence;
     finishRecording();
+}
+
+void KKeySequenceWidgetPrivate::recordKey(int key, quint32 held)
+{
+    // A first key without Control, Alt, Meta or the keypad must be one that makes sense alone.
+    if (keyCount == 0 && (held & ~quint32(Qt::ShiftModifier)) == 0 && !keyAllowedAlone(key) &&
+        !bareFirstKeyAllowed)
+        return;
+    if (key == 0)
+        return;
+
+    int combined = 0;
+    if (key == Qt::Key_Backtab && (heldModifiers & Qt::ShiftModifier))
+        combined = Qt::Key_Tab | int(heldModifiers);
+    else if (KKeyServer::isShiftAsModifierAllowed(key))
+        combined = key | int(heldModifiers);
+    else
+        combined = key | int(heldModifiers & ~quint32(Qt::ShiftModifier));
+
+    if (keyCount > 0)
+        sequence = appendKey(sequence, combined);
+    else
+        sequence = QKeySequence(combined);
+    ++keyCount;
+
+    if (!multiKeyShortcutsAllowed || keyCount >= quint32(longestSequence)) {
+        finishRecording();
+        return;
+    }
+    if (heldModifiers != 0)
+        releaseTimer.stop();
+    else
+        releaseTimer.start(releaseDelayMs);
+    refreshButtonText();
 }
 
 bool KKeySequenceWidgetPrivate::keyAllowedAlone(int key)

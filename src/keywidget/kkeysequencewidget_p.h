@@ -24,6 +24,9 @@ public:
     // Ends a recording without a new sequence: the one from before stays, and nothing is told.
     void cancelRecording();
     void refreshButtonText();
+    // A key pressed while recording, with the modifiers held: the sequence gains it, unless it is
+    // a first key that makes no sense alone.
+    void recordKey(int key, quint32 held);
     // A key press that Qt could not name: warn, and go back to the sequence before.
     void unsupportedKey();
 
