@@ -61,27 +61,34 @@ void BindingTree::rebuild()
 
 QTreeWidgetItem* BindingTree::makeRow(const Binding& binding)
 {
-    auto* row = new QTreeWidgetItem();
+    // All columns at once: a new row is made often, and one by one its texts cost more.
+    auto* row = new QTreeWidgetItem(columnsOf(binding));
+    row->setData(1, Qt::UserRole, binding.key);
     ids.insert(row, binding.id);
     rows.insert(binding.id, row);
-    show(row, binding);
+    searchedCurrent = false;
     return row;
+}
+
+QStringList BindingTree::columnsOf(const Binding& binding) const
+{
+    static const QString execCommand = QStringLiteral("ExecCommand");
+    const QString source = binding.source == BindingSource::Unset    ? QString()
+                           : binding.source == BindingSource::System ? systemText
+                                                                     : userText;
+    if (binding.isCommand())
+        return {binding.command, shownKey(binding.key), execCommand, source};
+    return {functionTexts.value(binding.function), shownKey(binding.key),
+            HotkeysModel::functionNames().at(binding.function), source};
 }
 
 void BindingTree::show(QTreeWidgetItem* row, const Binding& binding)
 {
     searchedCurrent = false;
-    if (binding.isCommand()) {
-        row->setText(0, binding.command);
-        row->setText(2, QStringLiteral("ExecCommand"));
-    } else {
-        row->setText(0, functionTexts.value(binding.function));
-        row->setText(2, HotkeysModel::functionNames().at(binding.function));
-    }
-    showKey(row, binding.key);
-    row->setText(3, binding.source == BindingSource::Unset    ? QString()
-                    : binding.source == BindingSource::System ? systemText
-                                                              : userText);
+    const QStringList columns = columnsOf(binding);
+    for (int column = 0; column < columns.size(); ++column)
+        row->setText(column, columns.at(column));
+    row->setData(1, Qt::UserRole, binding.key);
 }
 
 QString BindingTree::shownKey(const QString& key)

@@ -4,6 +4,7 @@
 
 #include <QHash>
 #include <QString>
+#include <QStringList>
 #include <QVector>
 
 class QTreeWidget;
@@ -58,6 +59,7 @@ public:
 
 private:
     QTreeWidgetItem* makeRow(const Binding& binding);
+    QStringList columnsOf(const Binding& binding) const;
     // Where a new row of the binding goes under its parent: after the row of the binding before
     // it, or of the last binding of an earlier function of the same group.
     int placeOf(const Binding& binding, QTreeWidgetItem* parent) const;
