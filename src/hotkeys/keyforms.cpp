@@ -176,11 +176,42 @@ QString keyFromUserText(const QString& text)
 
 namespace {
 
+QByteArray keyIdentityOf(int modifiers, quint32 sym)
+{
+    return "k:" + QByteArray::number(modifiers) + ':' + QByteArray::number(sym, 16);
+}
+
+// Most keys hold no "none": their parts are read where they stand.
+bool plainIdentity(const QByteArray& folded, QByteArray* identity)
+{
+    if (folded.contains("none"))
+        return false;
+    int modifiers = 0;
+    int start = 0;
+    for (int i = 0; i < folded.size(); ++i) {
+        if (folded.at(i) != '|' && folded.at(i) != '+')
+            continue;
+        const int bit = modifierBit(QByteArray::fromRawData(folded.constData() + start, i - start));
+        if (!bit) {
+            *identity = "t:" + folded;
+            return true;
+        }
+        modifiers |= bit;
+        start = i + 1;
+    }
+    const quint32 sym = ZemKeyServer::keysymOfNameNoCase(folded.mid(start));
+    *identity = sym ? keyIdentityOf(modifiers, sym) : "t:" + folded;
+    return true;
+}
+
 QByteArray identityOf(const QByteArray& fileKey)
 {
     // Everything below works on the key without letter case, so that keys the file takes for
     // one are one key here too.
     const QByteArray folded = foldedKey(unquoted(fileKey));
+    QByteArray plain;
+    if (plainIdentity(folded, &plain))
+        return plain.isEmpty() || folded.isEmpty() ? "p:" + folded : plain;
     QList<QByteArray> parts = QByteArray(folded).replace('|', '+').split('+');
     // As reading does: "None" before a name and placeholders ("None" and digits) go.
     QList<QByteArray> kept;
@@ -212,22 +243,23 @@ QByteArray identityOf(const QByteArray& fileKey)
     const quint32 sym = ZemKeyServer::keysymOfNameNoCase(kept.last());
     if (!sym)
         return "t:" + folded;
-    return "k:" + QByteArray::number(modifiers) + ':' + QByteArray::number(sym, 16);
+    return keyIdentityOf(modifiers, sym);
 }
 
 } // namespace
 
 QByteArray keyIdentity(const QByteArray& fileKey)
 {
-    // Loading and writing ask for the same few keys again and again.
-    static QHash<QByteArray, QByteArray> known;
-    const auto it = known.constFind(fileKey);
-    if (it != known.cend())
+    // Loading and writing ask for the same keys again and again. Kept for the life of the
+    // process, which ends without taking it apart.
+    static auto* known = new QHash<QByteArray, QByteArray>;
+    const auto it = known->constFind(fileKey);
+    if (it != known->cend())
         return *it;
-    if (known.size() > 100000)
-        known.clear();
+    if (known->size() > 100000)
+        known->clear();
     const QByteArray identity = identityOf(fileKey);
-    known.insert(fileKey, identity);
+    known->insert(fileKey, identity);
     return identity;
 }
 
