@@ -302,10 +302,10 @@ void TestHotkeysFile::writeKeepsModeAndLink()
     QVERIFY(QFile::link(target, link));
 
     // An access list and an attribute of the user's own, which a save must not drop.
-    QCOMPARE(QProcess::execute(QStringLiteral("setfacl"),
-                               {QStringLiteral("-m"), QStringLiteral("u:65534:r"), target}),
-             0);
-    QCOMPARE(::setxattr(QFile::encodeName(target).constData(), "user.zem", "kept", 4, 0), 0);
+    if (QProcess::execute(QStringLiteral("setfacl"),
+                          {QStringLiteral("-m"), QStringLiteral("u:65534:r"), target}) != 0 ||
+        ::setxattr(QFile::encodeName(target).constData(), "user.zem", "kept", 4, 0) != 0)
+        QSKIP("the file system here keeps no access lists or attributes of users");
     const QFile::Permissions mode = QFile::permissions(target); // the access list's mask in it
 
     QString reason;
