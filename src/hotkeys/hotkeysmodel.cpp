@@ -402,8 +402,10 @@ BindingId HotkeysModel::rowForFunction(const QString& name)
     const int function = catalogueFunctionIndex(name);
     if (function < 0)
         return 0;
+    // A row without a key that stands on a line of the file (a keyless entry read) keeps that
+    // line: the key goes to a row of its own.
     for (const Binding& row : functionRows.at(function)) {
-        if (row.key.isEmpty())
+        if (row.key.isEmpty() && row.fileKey.isEmpty())
             return row.id;
     }
     return cloneRow(functionRows.at(function).last().id);
