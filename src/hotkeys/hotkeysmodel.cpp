@@ -294,27 +294,29 @@ QStringList HotkeysModel::revert(BindingId id, BindingId* focus)
     return held;
 }
 
+void HotkeysModel::takeSystemKey(Binding* row, const Binding& given)
+{
+    row->key = given.key;
+    row->fileKey = given.fileKey;
+    row->source = BindingSource::System;
+    row->origin = given.origin;
+    row->keyRecorded = false;
+    enable(given.fileKey);
+}
+
 void HotkeysModel::giveBackOrKeepOff(const Binding& freed)
 {
     const QByteArray identity = keyIdentity(freed.fileKey);
     if (freed.key.isEmpty() || holderOfFileKey(freed.fileKey))
         return;
     // The row the system file gives the key to, where it has none now (a Reassign took it).
-    const auto giveTo = [&](Binding* row, const Binding& given) {
-        row->key = given.key;
-        row->fileKey = given.fileKey;
-        row->source = BindingSource::System;
-        row->origin = given.origin;
-        row->keyRecorded = false;
-        enable(given.fileKey);
-    };
     for (auto it = systemBindings.cbegin(); it != systemBindings.cend(); ++it) {
         for (const Binding& given : *it) {
             if (keyIdentity(given.fileKey) != identity)
                 continue;
             for (Binding& row : functionRows[it.key()]) {
                 if (row.key.isEmpty()) {
-                    giveTo(&row, given);
+                    takeSystemKey(&row, given);
                     return;
                 }
             }
@@ -325,7 +327,7 @@ void HotkeysModel::giveBackOrKeepOff(const Binding& freed)
             continue;
         for (Binding& row : commandRows) {
             if (row.key.isEmpty() && row.command == given.command) {
-                giveTo(&row, given);
+                takeSystemKey(&row, given);
                 return;
             }
         }
@@ -369,12 +371,7 @@ QStringList HotkeysModel::revertCommand(Binding* row)
             heldElsewhere << given.key;
             continue;
         }
-        row->key = given.key;
-        row->fileKey = given.fileKey;
-        row->source = BindingSource::System;
-        row->origin = given.origin;
-        row->keyRecorded = false;
-        enable(given.fileKey);
+        takeSystemKey(row, given);
         giveBackOrKeepOff(old);
         return QStringList();
     }

@@ -148,6 +148,8 @@ private:
     // The key of a row the revert took it from, back to the row without a key the system file
     // gives it to; false when there is none, and then it is switched off as any freed key.
     void giveBackOrKeepOff(const Binding& freed);
+    // The row gets the key the system file gives, as the system's.
+    void takeSystemKey(Binding* row, const Binding& given);
 
     QVector<QVector<Binding>> functionRows;
     QVector<Binding> commandRows;
