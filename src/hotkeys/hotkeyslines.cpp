@@ -18,119 +18,21 @@ bool isNewLine(char c)
 class Scanner
 {
 public:
-    Scanner(const QByteArray& data, int from, QVector<HotkeysLine>* found)
-        : data(data), d(data.constData()), size(data.contains('\0') ? data.indexOf('\0') : data.size()),
-          found(found), p(from)
-    {
-    }
-
-    void run()
-    {
-        while (p < size) {
-            int lineStart = p;
-            const int q = skipSpaces(p, &lineStart, true);
-            if (q >= size)
-                break;
-            if (d[q] == ';' || d[q] == '#')
-                p = endOfLine(q);
-            else if (d[q] == '[')
-                p = section(q, lineStart);
-            else
-                p = entry(q, lineStart);
-        }
-    }
+    Scanner(const QByteArray& data, int from, QVector<HotkeysLine>* found);
+    void run();
 
 private:
     // Steps over one line end, "\r\n" counting as one.
-    int newLineLength(int at) const { return d[at] == '\r' && at + 1 < size && d[at + 1] == '\n' ? 2 : 1; }
+    int newLineLength(int at) const;
     int withLineEnd(int at) const { return at < size ? at + newLineLength(at) : at; }
-
     // Skips blanks and line ends from `at`; `lineStart` follows the line ends passed.
-    int skipSpaces(int at, int* lineStart, bool crossLines)
-    {
-        while (at < size && isSpace(d[at]) && (crossLines || !isNewLine(d[at]))) {
-            if (isNewLine(d[at])) {
-                at += newLineLength(at);
-                ++line;
-                if (lineStart)
-                    *lineStart = at;
-            } else {
-                ++at;
-            }
-        }
-        return at;
-    }
-
-    int endOfLine(int at) const
-    {
-        while (at < size && !isNewLine(d[at]))
-            ++at;
-        return at;
-    }
-
-    int trimmedEnd(int from, int to) const
-    {
-        while (to > from && isSpace(d[to - 1]))
-            --to;
-        return to;
-    }
-
+    int skipSpaces(int at, int* lineStart, bool crossLines);
+    int endOfLine(int at) const;
+    int trimmedEnd(int from, int to) const;
     // A section header at q; where the scan goes on.
-    int section(int q, int lineStart)
-    {
-        HotkeysLine header;
-        header.kind = HotkeysLine::Section;
-        header.number = line;
-        header.start = lineStart;
-        const int nameStart = skipSpaces(q + 1, nullptr, true);
-        const int r = endOfLine(nameStart);
-        int close = nameStart;
-        while (close < r && d[close] != ']')
-            ++close;
-        current = found->size();
-        if (close >= r) {
-            // The reader takes the unclosed name as the section of the lines that follow, a
-            // section no file names: they are out of [ShortCutKeys].
-            header.valid = false;
-            header.end = withLineEnd(r);
-            found->append(header);
-            return r;
-        }
-        header.name = data.mid(nameStart, trimmedEnd(nameStart, close) - nameStart);
-        const int eol = endOfLine(close);
-        header.end = withLineEnd(eol);
-        found->append(header);
-        // The line end is left for the next skip, as the reader does; it counts the line.
-        return eol;
-    }
-
+    int section(int q, int lineStart);
     // An entry, or a line the reader skips, at q; where the scan goes on.
-    int entry(int q, int lineStart)
-    {
-        int r = q;
-        while (r < size && d[r] != '=' && !isNewLine(d[r]))
-            ++r;
-        if (r >= size || d[r] != '=' || r == q) {
-            // No "=": not an entry. An empty key: the rest of the line is skipped.
-            return endOfLine(r);
-        }
-        HotkeysLine entry;
-        entry.kind = HotkeysLine::Entry;
-        entry.number = line;
-        entry.start = lineStart;
-        entry.section = current;
-        entry.key = data.mid(q, trimmedEnd(q, r) - q);
-        const int valueStart = skipSpaces(r + 1, nullptr, false);
-        const int eol = endOfLine(valueStart);
-        entry.valueStart = valueStart;
-        entry.valueEnd = trimmedEnd(valueStart, eol);
-        entry.value = data.mid(valueStart, entry.valueEnd - valueStart);
-        entry.end = withLineEnd(eol);
-        if (eol < size)
-            ++line;
-        found->append(entry);
-        return entry.end;
-    }
+    int entry(int q, int lineStart);
 
     const QByteArray& data;
     const char* d;
@@ -140,6 +42,117 @@ private:
     int line = 1;
     int current = -1; // the section the lines now met belong to
 };
+
+Scanner::Scanner(const QByteArray& data, int from, QVector<HotkeysLine>* found)
+    : data(data), d(data.constData()), size(data.contains('\0') ? data.indexOf('\0') : data.size()),
+      found(found), p(from)
+{
+}
+
+void Scanner::run()
+{
+    while (p < size) {
+        int lineStart = p;
+        const int q = skipSpaces(p, &lineStart, true);
+        if (q >= size)
+            break;
+        if (d[q] == ';' || d[q] == '#')
+            p = endOfLine(q);
+        else if (d[q] == '[')
+            p = section(q, lineStart);
+        else
+            p = entry(q, lineStart);
+    }
+}
+
+int Scanner::newLineLength(int at) const
+{
+    return d[at] == '\r' && at + 1 < size && d[at + 1] == '\n' ? 2 : 1;
+}
+
+int Scanner::skipSpaces(int at, int* lineStart, bool crossLines)
+{
+    while (at < size && isSpace(d[at]) && (crossLines || !isNewLine(d[at]))) {
+        if (isNewLine(d[at])) {
+            at += newLineLength(at);
+            ++line;
+            if (lineStart)
+                *lineStart = at;
+        } else {
+            ++at;
+        }
+    }
+    return at;
+}
+
+int Scanner::endOfLine(int at) const
+{
+    while (at < size && !isNewLine(d[at]))
+        ++at;
+    return at;
+}
+
+int Scanner::trimmedEnd(int from, int to) const
+{
+    while (to > from && isSpace(d[to - 1]))
+        --to;
+    return to;
+}
+
+int Scanner::section(int q, int lineStart)
+{
+    HotkeysLine header;
+    header.kind = HotkeysLine::Section;
+    header.number = line;
+    header.start = lineStart;
+    const int nameStart = skipSpaces(q + 1, nullptr, true);
+    const int r = endOfLine(nameStart);
+    int close = nameStart;
+    while (close < r && d[close] != ']')
+        ++close;
+    current = found->size();
+    if (close >= r) {
+        // The reader takes the unclosed name as the section of the lines that follow, a
+        // section no file names: they are out of [ShortCutKeys].
+        header.valid = false;
+        header.end = withLineEnd(r);
+        found->append(header);
+        return r;
+    }
+    header.name = data.mid(nameStart, trimmedEnd(nameStart, close) - nameStart);
+    const int eol = endOfLine(close);
+    header.end = withLineEnd(eol);
+    found->append(header);
+    // The line end is left for the next skip, as the reader does; it counts the line.
+    return eol;
+}
+
+int Scanner::entry(int q, int lineStart)
+{
+    int r = q;
+    while (r < size && d[r] != '=' && !isNewLine(d[r]))
+        ++r;
+    if (r >= size || d[r] != '=' || r == q) {
+        // No "=": not an entry. An empty key: the rest of the line is skipped.
+        return endOfLine(r);
+    }
+    HotkeysLine entry;
+    entry.kind = HotkeysLine::Entry;
+    entry.number = line;
+    entry.start = lineStart;
+    entry.section = current;
+    entry.key = data.mid(q, trimmedEnd(q, r) - q);
+    const int valueStart = skipSpaces(r + 1, nullptr, false);
+    const int eol = endOfLine(valueStart);
+    entry.valueStart = valueStart;
+    entry.valueEnd = trimmedEnd(valueStart, eol);
+    entry.value = data.mid(valueStart, entry.valueEnd - valueStart);
+    entry.end = withLineEnd(eol);
+    if (eol < size)
+        ++line;
+    found->append(entry);
+    return entry.end;
+}
 
 } // namespace
 
