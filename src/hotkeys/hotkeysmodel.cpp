@@ -4,6 +4,7 @@
 #include "hotkeysentries.h"
 #include "hotkeysfile.h"
 #include "hotkeysreader.h"
+#include "hotkeysrevert.h"
 #include "hotkeyswriter.h"
 #include "keyforms.h"
 
@@ -233,149 +234,14 @@ void HotkeysModel::reassign(BindingId holder, BindingId target)
     assignKey(to, moved.key, fileKeyOf(moved), moved.keyRecorded);
 }
 
-QVector<Binding> HotkeysModel::systemRowsOf(int function) const
-{
-    const QVector<Binding> read = systemBindings.value(function);
-    QVector<Binding> rows;
-    for (const Binding& binding : read) {
-        const Binding* holder = find(holderOfFileKey(binding.fileKey));
-        if (!holder || holder->function == function)
-            rows.append(binding);
-    }
-    // As loading arranges them: the first read first, the others after it, the last read nearest.
-    if (rows.size() > 2)
-        std::reverse(rows.begin() + 1, rows.end());
-    return rows;
-}
-
-bool HotkeysModel::differsFromSystem(int function) const
-{
-    const QVector<Binding> expected = systemRowsOf(function);
-    const QVector<Binding>& rows = functionRows.at(function);
-    if (expected.isEmpty())
-        return rows.size() != 1 || !rows.first().key.isEmpty();
-    if (rows.size() != expected.size())
-        return true;
-    for (int i = 0; i < rows.size(); ++i) {
-        if (rows.at(i).source != BindingSource::System ||
-            keyIdentity(rows.at(i).fileKey) != keyIdentity(expected.at(i).fileKey))
-            return true;
-    }
-    return false;
-}
-
 bool HotkeysModel::canRevert(BindingId id) const
 {
-    const Binding* row = find(id);
-    if (!row)
-        return false;
-    if (!row->isCommand())
-        return differsFromSystem(row->function);
-    const auto given = std::find_if(systemCommands.cbegin(), systemCommands.cend(),
-                                    [&](const Binding& b) { return b.command == row->command; });
-    return given != systemCommands.cend() &&
-           (row->source != BindingSource::System || keyIdentity(row->fileKey) != keyIdentity(given->fileKey));
+    return HotkeysRevert(const_cast<HotkeysModel*>(this)).canRevert(id);
 }
 
 QStringList HotkeysModel::revert(BindingId id, BindingId* focus)
 {
-    Binding* row = findMutable(id);
-    if (!row)
-        return QStringList();
-    if (row->isCommand()) {
-        if (focus)
-            *focus = id;
-        return revertCommand(row);
-    }
-    const int function = row->function;
-    const QStringList held = revertFunction(function);
-    if (focus)
-        *focus = functionRows.at(function).first().id;
-    return held;
-}
-
-void HotkeysModel::takeSystemKey(Binding* row, const Binding& given)
-{
-    row->key = given.key;
-    row->fileKey = given.fileKey;
-    row->source = BindingSource::System;
-    row->origin = given.origin;
-    row->keyRecorded = false;
-    enable(given.fileKey);
-}
-
-void HotkeysModel::giveBackOrKeepOff(const Binding& freed)
-{
-    const QByteArray identity = keyIdentity(freed.fileKey);
-    if (freed.key.isEmpty() || holderOfFileKey(freed.fileKey))
-        return;
-    // The row the system file gives the key to, where it has none now (a Reassign took it).
-    for (auto it = systemBindings.cbegin(); it != systemBindings.cend(); ++it) {
-        for (const Binding& given : *it) {
-            if (keyIdentity(given.fileKey) != identity)
-                continue;
-            for (Binding& row : functionRows[it.key()]) {
-                if (row.key.isEmpty()) {
-                    takeSystemKey(&row, given);
-                    return;
-                }
-            }
-        }
-    }
-    for (const Binding& given : qAsConst(systemCommands)) {
-        if (keyIdentity(given.fileKey) != identity)
-            continue;
-        for (Binding& row : commandRows) {
-            if (row.key.isEmpty() && row.command == given.command) {
-                takeSystemKey(&row, given);
-                return;
-            }
-        }
-    }
-    keepFreedKeyOff(freed);
-}
-
-QStringList HotkeysModel::revertFunction(int function)
-{
-    QVector<Binding>& rows = functionRows[function];
-    const QVector<Binding> old = rows;
-    rows.clear();
-    QStringList heldElsewhere;
-    for (const Binding& binding : systemBindings.value(function)) {
-        if (holderOfFileKey(binding.fileKey)) {
-            heldElsewhere << binding.key;
-            continue;
-        }
-        rows.append(Binding{++lastId, function, QString(), binding.key, binding.fileKey,
-                            BindingSource::System, binding.origin, false});
-        enable(binding.fileKey);
-    }
-    if (rows.size() > 2)
-        std::reverse(rows.begin() + 1, rows.end());
-    if (rows.isEmpty())
-        rows.append(Binding{++lastId, function, QString(), QString(), QByteArray(), BindingSource::Unset,
-                            nullptr, false});
-    for (const Binding& row : old)
-        giveBackOrKeepOff(row);
-    return heldElsewhere;
-}
-
-QStringList HotkeysModel::revertCommand(Binding* row)
-{
-    const Binding old = *row;
-    QStringList heldElsewhere;
-    for (const Binding& given : qAsConst(systemCommands)) {
-        if (given.command != row->command)
-            continue;
-        if (holderOfFileKey(given.fileKey, row->id)) {
-            heldElsewhere << given.key;
-            continue;
-        }
-        takeSystemKey(row, given);
-        giveBackOrKeepOff(old);
-        return QStringList();
-    }
-    return heldElsewhere;
+    return HotkeysRevert(this).revert(id, focus);
 }
 
 void HotkeysModel::setCommand(BindingId id, const QString& command)

@@ -127,6 +127,7 @@ public:
 
 private:
     friend class HotkeysReader;
+    friend class HotkeysRevert;
     friend class HotkeysWriter;
 
     struct Kept
@@ -139,17 +140,6 @@ private:
     void assignKey(Binding* row, const QString& key, const QByteArray& fileKey, bool recorded);
     void keepFreedKeyOff(const Binding& row);
     void enable(const QByteArray& fileKey);
-    // The system file's rows of the function, as loading arranges them, less the keys that rows
-    // of other functions hold.
-    QVector<Binding> systemRowsOf(int function) const;
-    bool differsFromSystem(int function) const;
-    QStringList revertFunction(int function);
-    QStringList revertCommand(Binding* row);
-    // The key of a row the revert took it from, back to the row without a key the system file
-    // gives it to; false when there is none, and then it is switched off as any freed key.
-    void giveBackOrKeepOff(const Binding& freed);
-    // The row gets the key the system file gives, as the system's.
-    void takeSystemKey(Binding* row, const Binding& given);
 
     QVector<QVector<Binding>> functionRows;
     QVector<Binding> commandRows;
