@@ -3,12 +3,11 @@
 #include "bindingtree.h"
 #include "editcommands.h"
 #include "filterbar.h"
-#include "handbook.h"
 #include "hotkeysfile.h"
 #include "keypanel.h"
 #include "kkeysequencewidget.h"
 #include "modelcommand.h"
-#include "zemhelpmenu.h"
+#include "windowmenus.h"
 
 #include <QAction>
 #include <QButtonGroup>
@@ -18,7 +17,6 @@
 #include <QGroupBox>
 #include <QHBoxLayout>
 #include <QHeaderView>
-#include <QIcon>
 #include <QLabel>
 #include <QMenu>
 #include <QMenuBar>
@@ -28,7 +26,6 @@
 #include <QSettings>
 #include <QStatusBar>
 #include <QTimer>
-#include <QToolBar>
 #include <QTreeWidget>
 #include <QTreeWidgetItemIterator>
 #include <QUndoStack>
@@ -42,18 +39,6 @@ QMenu* KeysConfForm::popupMenu = nullptr;
 QString KeysConfForm::currentFile;
 QString KeysConfForm::startupFile;
 
-namespace {
-
-QAction* makeAction(QObject* parent, const QString& text, const char* iconName)
-{
-    auto* action = new QAction(text, parent);
-    if (iconName)
-        action->setIcon(QIcon::fromTheme(QLatin1String(iconName)));
-    return action;
-}
-
-} // namespace
-
 KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     : QMainWindow(parent, flags), edited(new EditedFile(this)), model(edited->model())
 {
@@ -65,9 +50,7 @@ KeysConfForm::KeysConfForm(QWidget* parent, Qt::WindowFlags flags)
     files = new FileCommands(this, edited, undoStack, this);
 
     createCentralParts();
-    createActions();
     createMenus();
-    createToolBar();
     connectParts();
 }
 
@@ -113,120 +96,24 @@ void KeysConfForm::createCentralParts()
     mainLayout->addWidget(keyPanel);
 }
 
-void KeysConfForm::createActions()
-{
-    fileNewAction = makeAction(this, tr("&New file"), "document-new");
-    fileOpenAction = makeAction(this, tr("&Open..."), "document-open");
-    fileRestoreAction = makeAction(this, tr("&Restore..."), "view-refresh");
-    fileRestoreAction->setToolTip(tr("Restore user's keyshortcutrc file from system one"));
-    fileSaveAction = makeAction(this, tr("&Save"), "document-save");
-    fileSaveAsAction = makeAction(this, tr("Save &As..."), "document-save-as");
-    fileExitAction = makeAction(this, tr("E&xit"), nullptr);
-    fileApplyAction = makeAction(this, tr("Apply"), "dialog-ok-apply");
-    newCommandAction = makeAction(this, tr("&New action"), "edit-add");
-    cloneCommandAction = makeAction(this, tr("&Clone"), "edit-copy");
-    editCommandAction = makeAction(this, tr("&Edit"), "document-properties");
-    editCommandAction->setShortcut(Qt::Key_Return);
-    deleteCommandAction = makeAction(this, tr("&Delete"), "edit-delete");
-    deleteCommandAction->setShortcut(Qt::Key_Delete);
-    // The desktop's own keys for the file commands; Apply, which saves and hands over, gets
-    // Ctrl+Return.
-    fileNewAction->setShortcut(QKeySequence::New);
-    fileOpenAction->setShortcut(QKeySequence::Open);
-    fileSaveAction->setShortcut(QKeySequence::Save);
-    fileSaveAsAction->setShortcut(QKeySequence::SaveAs);
-    fileExitAction->setShortcut(QKeySequence::Quit);
-    fileApplyAction->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_Return));
-    const std::pair<QAction*, const char*> names[] = {
-        {fileNewAction, "fileNewAction"},
-        {fileOpenAction, "fileOpenAction"},
-        {fileRestoreAction, "fileRestoreAction"},
-        {fileSaveAction, "fileSaveAction"},
-        {fileSaveAsAction, "fileSaveAsAction"},
-        {fileExitAction, "fileExitAction"},
-        {fileApplyAction, "fileApplyAction"},
-        {newCommandAction, "newCommandAction"},
-        {cloneCommandAction, "cloneCommandAction"},
-        {editCommandAction, "editCommandAction"},
-        {deleteCommandAction, "deleteCommandAction"},
-    };
-    for (const auto& [action, name] : names)
-        action->setObjectName(QLatin1String(name));
-}
-
 void KeysConfForm::createMenus()
 {
-    menuBar = new QMenuBar(this);
-    fileMenu = new QMenu(tr("&File"), menuBar);
-    fileMenu->addAction(fileNewAction);
-    fileMenu->addAction(fileOpenAction);
-    fileMenu->addAction(fileRestoreAction);
-    fileMenu->addAction(fileSaveAction);
-    fileMenu->addAction(fileSaveAsAction);
-    fileMenu->addAction(fileApplyAction);
-    fileMenu->addSeparator();
-    fileMenu->addAction(fileExitAction);
-    menuBar->addMenu(fileMenu);
-    QAction* undoAction = undoStack->createUndoAction(this, tr("Undo"));
-    undoAction->setObjectName(QStringLiteral("undoAction"));
-    undoAction->setShortcut(QKeySequence::Undo);
-    QAction* redoAction = undoStack->createRedoAction(this, tr("Redo"));
-    redoAction->setObjectName(QStringLiteral("redoAction"));
-    redoAction->setShortcut(QKeySequence::Redo);
-    revertAction = makeAction(this, tr("Revert to System Binding"), "edit-undo");
-    revertAction->setObjectName(QStringLiteral("revertAction"));
-    revertAction->setEnabled(false);
-    QMenu* editMenu = new QMenu(tr("&Edit"), menuBar);
-    editMenu->addAction(undoAction);
-    editMenu->addAction(redoAction);
-    editMenu->addSeparator();
-    editMenu->addAction(revertAction);
-    menuBar->addMenu(editMenu);
-    auto* helpMenu = new ZemHelpMenu(this);
-    auto* handbookAction =
-        new QAction(QIcon::fromTheme(QStringLiteral("help-contents")), tr("Handbook"), this);
-    handbookAction->setObjectName(QStringLiteral("handbookAction"));
-    handbookAction->setShortcut(QKeySequence::HelpContents);
-    connect(handbookAction, &QAction::triggered, this, [this] {
-        auto* handbook = findChild<Handbook*>();
-        if (!handbook)
-            handbook = new Handbook(this);
-        handbook->show();
-        handbook->raise();
-        handbook->activateWindow();
-    });
-    helpMenu->insertAction(helpMenu->actions().value(0), handbookAction);
-    helpMenu->insertSeparator(helpMenu->actions().value(1));
-    menuBar->addMenu(helpMenu);
-    setMenuWidget(menuBar);
-}
-
-void KeysConfForm::createToolBar()
-{
-    toolBar = new QToolBar(tr("Actions toolbar"), this);
-    toolBar->setObjectName(QStringLiteral("toolbar"));
-    toolBar->addAction(fileNewAction);
-    toolBar->addAction(fileOpenAction);
-    toolBar->addAction(fileRestoreAction);
-    toolBar->addAction(fileSaveAction);
-    toolBar->addAction(fileSaveAsAction);
-    toolBar->addAction(fileApplyAction);
-    toolBar->addSeparator();
-    toolBar->addAction(newCommandAction);
-    toolBar->addAction(cloneCommandAction);
-    toolBar->addAction(editCommandAction);
-    toolBar->addAction(deleteCommandAction);
-    addToolBar(toolBar);
-    // Buttons that show only an icon are named for screen readers and in their tool tips.
-    for (QAction* action : toolBar->actions()) {
-        if (action->isSeparator())
-            continue;
-        QWidget* button = toolBar->widgetForAction(action);
-        const QString name = action->text().remove(QLatin1Char('&'));
-        button->setAccessibleName(name);
-        if (action != fileRestoreAction)
-            action->setToolTip(name);
-    }
+    const WindowMenus menus(this, undoStack);
+    fileNewAction = menus.fileNewAction;
+    fileOpenAction = menus.fileOpenAction;
+    fileRestoreAction = menus.fileRestoreAction;
+    fileSaveAction = menus.fileSaveAction;
+    fileSaveAsAction = menus.fileSaveAsAction;
+    fileExitAction = menus.fileExitAction;
+    fileApplyAction = menus.fileApplyAction;
+    newCommandAction = menus.newCommandAction;
+    cloneCommandAction = menus.cloneCommandAction;
+    editCommandAction = menus.editCommandAction;
+    deleteCommandAction = menus.deleteCommandAction;
+    revertAction = menus.revertAction;
+    menuBar = menus.menuBar;
+    fileMenu = menus.fileMenu;
+    toolBar = menus.toolBar;
 }
 
 void KeysConfForm::connectParts()

@@ -118,9 +118,7 @@ protected:
 private:
     // The parts of the window, made in this order.
     void createCentralParts();
-    void createActions();
     void createMenus();
-    void createToolBar();
     void connectParts();
     void showHeaderMenu(const QPoint& position);
     // The tree follows every change of the bindings, with the row it is about made current.
